@@ -1,0 +1,171 @@
+// tsdemo: acts as a host. It links the reference host runtime, loads
+// libtsmath.so at run time as a host would, sets up a workspace arena and
+// runs analysis steps on a generated data set, printing results and codes.
+//
+//   tsdemo [path/to/libtsmath.so]
+#include <dlfcn.h>
+
+#include <cmath>
+#include <cstdio>
+#include <cstdlib>
+#include <cstring>
+#include <vector>
+
+#include "tsmath/tsmath.h"
+#include "tsrt.h"
+
+namespace {
+
+void* gLibrary = nullptr;
+
+template <class Fn>
+Fn Entry(const char* name) {
+  void* f = dlsym(gLibrary, name);
+  if (f == nullptr) {
+    std::fprintf(stderr, "tsdemo: %s is not exported\n", name);
+    std::exit(2);
+  }
+  return reinterpret_cast<Fn>(f);
+}
+#define ENTRY(name) Entry<decltype(&name)>(#name)
+
+template <class Block>
+Block** NewArray(int32_t type, const std::vector<double>& v) {
+  return static_cast<Block**>(tsrt_new_array(type, static_cast<int32_t>(v.size()), v.data()));
+}
+
+int32_t CountOf(void* h) {
+  int32_t n;
+  std::memcpy(&n, *static_cast<void**>(h), 4);
+  return n;
+}
+
+double F64At(F64ArrayHdl h, int32_t i) {
+  double v;
+  std::memcpy(&v, reinterpret_cast<char*>(*h) + 4 + 8 * i, 8);
+  return v;
+}
+
+int32_t I32At(I32ArrayHdl h, int32_t i) {
+  int32_t v;
+  std::memcpy(&v, reinterpret_cast<char*>(*h) + 4 + 4 * i, 4);
+  return v;
+}
+
+// A data set with a known shape: 2000 readings of a 50 Hz-like tone of
+// amplitude 2 on an offset of 10, with noise from a fixed linear congruential
+// source and a stuck sensor value (12.5) repeated now and then.
+std::vector<double> Readings() {
+  std::vector<double> x(2000);
+  uint64_t s = 12345;
+  for (size_t i = 0; i < x.size(); ++i) {
+    s = s * 6364136223846793005ull + 1442695040888963407ull;
+    const double noise = (static_cast<double>(s >> 11) / 9007199254740992.0 - 0.5) * 0.8;
+    x[i] = (i % 97 == 0) ? 12.5 : 10.0 + 2.0 * std::sin(2 * M_PI * 50.0 * i / 1000.0 + 0.3) + noise;
+  }
+  return x;
+}
+
+}  // namespace
+
+int main(int argc, char** argv) {
+  const char* path = argc > 1 ? argv[1] : TSM_LIBRARY_FILE;
+  gLibrary = dlopen(path, RTLD_NOW | RTLD_LOCAL);
+  if (gLibrary == nullptr) {
+    std::fprintf(stderr, "tsdemo: cannot load %s: %s\n", path, dlerror());
+    return 2;
+  }
+  std::printf("tsdemo: host runtime version %08x, library %s\n\n", gTSRTVersion, path);
+
+  ErrorCluster err{0, 0};
+  ENTRY(InitializeAnalysisWorkspaceH)(1u << 20, &err);
+  ENTRY(EnableAnalysisWorkspaceH)(&err);
+  std::printf("workspace: 1 MiB arena enabled, status %u code %d\n\n", err.status, err.code);
+
+  const std::vector<double> readings = Readings();
+  F64ArrayHdl x = NewArray<F64Array>(TSM_TYPE_F64, readings);
+  std::printf("data set: %zu readings, tone of amplitude 2 on 10, noise +-0.4, stuck value 12.5 every 97th\n\n",
+              readings.size());
+
+  double v = 0;
+  int32_t code = 0;
+  ENTRY(Mean_head)(x, &v, &code);
+  std::printf("  mean                  %.12g   (code %d)\n", v, code);
+  ENTRY(Median_head)(x, &v, &code);
+  std::printf("  median                %.12g   (code %d)\n", v, code);
+  ENTRY(RMS_head)(x, &v, &code);
+  std::printf("  rms                   %.12g   (code %d)\n", v, code);
+  for (int32_t order = 2; order <= 4; ++order) {
+    ENTRY(Moment_head)(x, &order, &v, &code);
+    std::printf("  central moment %d      %.12g   (code %d)\n", order, v, code);
+  }
+
+  std::vector<double> head(readings.begin(), readings.begin() + 1000);
+  std::vector<double> clean(1200);
+  for (size_t i = 0; i < clean.size(); ++i) clean[i] = 10.0 + 2.0 * std::sin(2 * M_PI * 50.0 * i / 1000.0 + 0.3);
+  F64ArrayHdl y = NewArray<F64Array>(TSM_TYPE_F64, clean);
+  F64ArrayHdl first = NewArray<F64Array>(TSM_TYPE_F64, head);
+  ENTRY(MSE_head)(first, y, &v, &code);
+  std::printf("  mse vs clean tone     %.12g   (code %d: lengths 1000 and 1200 differ)\n", v, code);
+
+  std::vector<double> iq(2 * readings.size());
+  for (size_t i = 0; i < readings.size(); ++i) {
+    iq[2 * i] = readings[i] - 10.0;
+    iq[2 * i + 1] = 0.5;
+  }
+  auto z = static_cast<CxArrayHdl>(tsrt_new_array(TSM_TYPE_CX128, static_cast<int32_t>(readings.size()), iq.data()));
+  code = ENTRY(CxRMS_head)(z, &v);
+  std::printf("  rms of complex        %.12g   (code %d)\n\n", v, code);
+
+  F64ArrayHdl modes = NewArray<F64Array>(TSM_TYPE_F64, {});
+  code = ENTRY(ModeH)(x, 0, modes);
+  std::printf("  modes, exact values:  ");
+  for (int32_t i = 0; i < CountOf(modes); ++i) std::printf("%.12g ", F64At(modes, i));
+  std::printf("  (code %d)\n", code);
+  code = ENTRY(ModeH)(x, 20, modes);
+  std::printf("  modes, 20 bins:       ");
+  for (int32_t i = 0; i < CountOf(modes); ++i) std::printf("%.6g ", F64At(modes, i));
+  std::printf("  (code %d)\n\n", code);
+
+  int32_t bins = 12;
+  auto counts = static_cast<I32ArrayHdl>(tsrt_new_array(TSM_TYPE_I32, 0, nullptr));
+  F64ArrayHdl centres = NewArray<F64Array>(TSM_TYPE_F64, {});
+  ENTRY(histgran_head)(x, &bins, counts, centres, &code);
+  std::printf("  histogram, %d bins (code %d):\n", bins, code);
+  for (int32_t b = 0; b < CountOf(counts); ++b) {
+    std::printf("    %8.4f %5d ", F64At(centres, b), I32At(counts, b));
+    for (int32_t k = 0; k < I32At(counts, b) / 8; ++k) std::putchar('#');
+    std::putchar('\n');
+  }
+
+  GenHistInterval bands[3] = {{8.0, 9.0, 0}, {9.0, 11.0, 0}, {11.0, 12.0, 2}};
+  auto intervals = static_cast<GenHistIntervalHdl>(tsrt_new_array(TSM_TYPE_U8, 0, nullptr));
+  NumericArrayResize(TSM_TYPE_U8, 1, &intervals, sizeof bands);
+  int32_t three = 3;
+  std::memcpy(*intervals, &three, 4);
+  std::memcpy(reinterpret_cast<char*>(*intervals) + 4, bands, sizeof bands);
+  GenHistOutliers out{};
+  ENTRY(GenHistH)(x, intervals, counts, &out, &code);
+  std::printf("\n  bands [8,9) [9,11) [11,12]: %d %d %d; outside %d (below %d, above %d)  (code %d)\n",
+              I32At(counts, 0), I32At(counts, 1), I32At(counts, 2), out.total, out.below, out.above, code);
+
+  F64ArrayHdl empty = NewArray<F64Array>(TSM_TYPE_F64, {});
+  ENTRY(Mean_head)(empty, &v, &code);
+  std::printf("\n  mean of an empty array: %g (code %d)\n", v, code);
+  std::vector<double> withNaN = {1.0, NAN, 3.0};
+  F64ArrayHdl bad = NewArray<F64Array>(TSM_TYPE_F64, withNaN);
+  ENTRY(Median_head)(bad, &v, &code);
+  std::printf("  median with a NaN:      %g (code %d)\n\n", v, code);
+
+  for (void* h : {static_cast<void*>(x), static_cast<void*>(y), static_cast<void*>(first), static_cast<void*>(z),
+                  static_cast<void*>(modes), static_cast<void*>(counts), static_cast<void*>(centres),
+                  static_cast<void*>(intervals), static_cast<void*>(empty), static_cast<void*>(bad)})
+    tsrt_dispose(h);
+
+  ENTRY(DisableAnalysisWorkspaceH)(&err);
+  ENTRY(UninitializeAnalysisWorkspaceH)(&err);
+  std::printf("workspace removed: status %u code %d; host blocks still live: %lld; clean-ups pending: %d\n",
+              err.status, err.code, static_cast<long long>(tsrt_live_blocks()), tsrt_cleanup_count());
+  tsrt_end_run();
+  return err.status == 0 && tsrt_live_blocks() == 0 ? 0 : 1;
+}

@@ -1,0 +1,85 @@
+/* tsmath: numerical analysis library, public C interface.
+ *
+ * Arrays cross the boundary as handles: a pointer to a pointer to a block that
+ * the host owns and may move at every resize. A 1-D block is an int32 count
+ * followed by the elements with no padding, so float64 elements stand at
+ * offset 4 of the block; a 2-D block is int32 rows, int32 cols, then the
+ * row-major elements at offset 8. The block structs below are packed to say
+ * exactly that. Entries resize outputs through the host's NumericArrayResize
+ * and write the dimension fields themselves. */
+#ifndef TSMATH_H
+#define TSMATH_H
+
+#include <stdint.h>
+
+#include "tsmath_codes.h"
+
+#if defined(TSM_BUILDING_LIBRARY)
+#define TSM_API __attribute__((visibility("default")))
+#else
+#define TSM_API
+#endif
+
+#ifdef __cplusplus
+extern "C" {
+#endif
+
+/* Type codes that NumericArrayResize receives. */
+enum {
+  TSM_TYPE_I32 = 3,
+  TSM_TYPE_U8 = 5,
+  TSM_TYPE_U32 = 7,
+  TSM_TYPE_F32 = 9,
+  TSM_TYPE_F64 = 10,
+  TSM_TYPE_CX64 = 12,
+  TSM_TYPE_CX128 = 13
+};
+
+/* A complex number: real part, then imaginary part. */
+typedef struct cx {
+  double re;
+  double im;
+} cx;
+
+#pragma pack(push, 1)
+typedef struct F64Array { int32_t count; double elt[1]; } F64Array;
+typedef struct F32Array { int32_t count; float elt[1]; } F32Array;
+typedef struct I32Array { int32_t count; int32_t elt[1]; } I32Array;
+typedef struct U8Array { int32_t count; uint8_t elt[1]; } U8Array;
+typedef struct U32Array { int32_t count; uint32_t elt[1]; } U32Array;
+typedef struct CxArray { int32_t count; cx elt[1]; } CxArray;
+typedef struct Matrix { int32_t rows; int32_t cols; double elt[1]; } Matrix;
+typedef struct CxMatrix { int32_t rows; int32_t cols; cx elt[1]; } CxMatrix;
+
+/* Error cluster of the workspace entries: the host's record goes on behind
+ * these two fields, which are all the library touches. */
+typedef struct ErrorCluster { uint8_t status; int32_t code; } ErrorCluster;
+
+/* One interval of the general histogram, 20 bytes. inclusion: 0 lower in and
+ * upper out, 1 lower out and upper in, 2 both in, 3 both out, any other value
+ * takes every sample as inside. */
+typedef struct GenHistInterval { double lower; double upper; int32_t inclusion; } GenHistInterval;
+typedef struct GenHistIntervalArray { int32_t count; GenHistInterval elt[1]; } GenHistIntervalArray;
+#pragma pack(pop)
+
+/* Samples of the general histogram that fell in no interval (total), below the
+ * first interval (below) and beyond the last (above). */
+typedef struct GenHistOutliers { int32_t total; int32_t below; int32_t above; } GenHistOutliers;
+
+typedef F64Array** F64ArrayHdl;
+typedef F32Array** F32ArrayHdl;
+typedef I32Array** I32ArrayHdl;
+typedef U8Array** U8ArrayHdl;
+typedef U32Array** U32ArrayHdl;
+typedef CxArray** CxArrayHdl;
+typedef Matrix** MatrixHdl;
+typedef CxMatrix** CxMatrixHdl;
+typedef GenHistIntervalArray** GenHistIntervalHdl;
+
+#include "tsmath_exports.h"
+
+#ifdef __cplusplus
+}
+#endif
+
+#endif

@@ -1,0 +1,123 @@
+/* tsmath error codes: the one vocabulary shared with the host.
+ *
+ * 0 is success, a negative value a failure, a positive value a warning whose
+ * results are valid. A code is chosen at the one test that fails and travels
+ * unchanged to the entry. The host holds the texts; the library holds none. */
+#ifndef TSMATH_CODES_H
+#define TSMATH_CODES_H
+
+#include <stdint.h>
+
+typedef int32_t ErrorCode;
+
+enum {
+  TSM_SUCCESS = 0,
+
+  /* failures */
+  TSM_ERR_NO_MEMORY = -20001,            /* memory exhausted, or the host refused a resize */
+  TSM_ERR_SIZE_MISMATCH = -20002,        /* two arrays that must have the same size don't */
+  TSM_ERR_EMPTY = -20003,                /* an array is empty, or a sample count is below 1 */
+  TSM_ERR_NEGATIVE_DIMENSION = -20004,   /* a dimension is negative */
+  TSM_ERR_ENDPOINT_COUNT = -20005,       /* end point mode needs one sample */
+  TSM_ERR_COUNT_BELOW_2 = -20006,
+  TSM_ERR_COUNT_BELOW_3 = -20007,
+  TSM_ERR_SIZE_PAIR = -20008,            /* sizes of a pair don't fit, or a count is negative */
+  TSM_ERR_NEGATIVE_TRANSFORM_SIZE = -20010,
+  TSM_ERR_DUTY_BELOW_ZERO = -20011,
+  TSM_ERR_DUTY_ABOVE_LIMIT = -20012,
+  TSM_ERR_WIDTH_RANGE = -20013,          /* a width outside 1 to count-1 */
+  TSM_ERR_PULSE_FIT = -20014,            /* delay and width don't fit into the count */
+  TSM_ERR_STEP_NOT_POSITIVE = -20016,    /* a sampling interval or step is not positive */
+  TSM_ERR_INDEX_RANGE = -20017,          /* an index, shift or 2-D frame size out of range */
+  TSM_ERR_START_OUTSIDE_BOUNDS = -20019,
+  TSM_ERR_CUTOFF = -20020,               /* cut-off above half the sampling rate or not positive */
+  TSM_ERR_ORDER_TOO_LOW = -20021,
+  TSM_ERR_DECIMATION_FACTOR = -20022,
+  TSM_ERR_FREQUENCY_ORDER = -20023,
+  TSM_ERR_RIPPLE = -20024,
+  TSM_ERR_SECOND_RIPPLE = -20025,
+  TSM_ERR_FIT_INITIAL = -20026,
+  TSM_ERR_EXP_FINAL_VALUE = -20027,
+  TSM_ERR_RIPPLE_ATTENUATION = -20028,
+  TSM_ERR_FILTER_LENGTH = -20031,
+  TSM_ERR_NEGATIVE_RANK = -20032,
+  TSM_ERR_EVEN_LENGTH = -20033,
+  TSM_ERR_LOG_DATA = -20036,
+  TSM_ERR_ORDER_TOO_HIGH = -20037,
+  TSM_ERR_INNER_DIMENSIONS = -20039,
+  TSM_ERR_NOT_SQUARE = -20040,
+  TSM_ERR_SINGULAR = -20041,
+  TSM_ERR_ANOVA_LEVEL_COUNT = -20042,
+  TSM_ERR_ANOVA_LEVEL_VALUES = -20043,
+  TSM_ERR_ANOVA_EMPTY_LEVEL = -20044,
+  TSM_ERR_ANOVA_DESIGN = -20045,
+  TSM_ERR_OVERFLOW = -20046,
+  TSM_ERR_ANOVA_CELL_SIZES = -20047,
+  TSM_ERR_ANOVA_REPETITIONS = -20048,
+  TSM_ERR_NOT_ASCENDING = -20049,
+  TSM_ERR_COINCIDENT_POINTS = -20050,
+  TSM_ERR_DEGREES_OF_FREEDOM = -20052,
+  TSM_ERR_PROBABILITY_RANGE = -20053,
+  TSM_ERR_TABLE_TOO_SMALL = -20055,
+  TSM_ERR_TABLE_NEGATIVE = -20056,
+  TSM_ERR_MATE_SIZE = -20058,
+  TSM_ERR_FACTOR_RANGE = -20059,
+  TSM_ERR_ZERO_DIVISOR = -20060,
+  TSM_ERR_BAD_SELECTOR = -20061,
+  TSM_ERR_NO_CONVERGENCE = -20062,
+  TSM_ERR_ODD_OR_FINITE = -20063,
+  TSM_ERR_TABLE_OVERFLOW = -20064,
+  TSM_ERR_STAGE_SIZE = -20066,
+  TSM_ERR_NON_FINITE = -20068,           /* the data hold NaN or an infinity */
+  TSM_ERR_GAUSS_FIT_POINTS = -20069,
+  TSM_ERR_MATRIX_PAIR = -20070,
+  TSM_ERR_NOT_POSITIVE_DEFINITE = -20071,
+  TSM_ERR_EIGEN_NO_CONVERGENCE = -20073,
+  TSM_ERR_EIGENVECTOR = -20074,
+  TSM_ERR_WORK_SIZE = -20075,
+  TSM_ERR_FFT_TABLE_RANGE = -20076,
+  TSM_ERR_NOT_PROVIDED = -20078,
+  TSM_ERR_HISTOGRAM_BOUNDS = -20101,     /* lower bound above upper bound */
+  TSM_ERR_NEGATIVE_ORDER = -20103,
+  TSM_ERR_NAN_ARGUMENT = -20104,         /* NaN where a bound or data point is needed */
+  TSM_ERR_NO_ROOT = -20111,
+  TSM_ERR_TRANSFORM_SIZE = -20115,
+  TSM_ERR_NON_FINITE_PARAMETER = -20116,
+  TSM_ERR_TOTAL_PRECISION_LOSS = -20117,
+  TSM_ERR_ARENA_EXISTS = -20120,
+  TSM_ERR_ARENA_ENABLED = -20121,
+  TSM_ERR_NO_ARENA = -20122,
+  TSM_ERR_ARENA_BLOCKS_LIVE = -20123,
+  TSM_ERR_ARENA_OWNER = -20124,
+  TSM_ERR_ARENA_EXHAUSTED = -20126,
+  TSM_ERR_COEFFICIENTS_SHORT = -20127,
+  TSM_ERR_NOT_POSITIVE = -20140,
+  TSM_ERR_NOTHING_TO_FIT = -20141,
+  TSM_ERR_TOO_FEW_CROSSINGS = -20308,
+  TSM_ERR_LEVELS_COINCIDE = -20309,
+  TSM_ERR_INCOMPLETE_TRANSITION = -20310,
+  TSM_ERR_NO_PULSE = -20311,
+  TSM_ERR_MEASUREMENT_COUNT = -20312,
+  TSM_ERR_REFERENCE_ORDER = -20313,
+  TSM_ERR_HISTOGRAM_ORDER = -20315,
+  TSM_ERR_METHOD_SELECTOR = -20316,
+  TSM_ERR_BIN_COUNT = -20317,
+  TSM_ERR_NO_CYCLE = -20319,
+  TSM_ERR_PULSE_NUMBER = -20323,
+  TSM_ERR_PULSE_MISSING = -20326,
+  TSM_ERR_MISSING_RECORD = -20331,
+  TSM_ERR_INTERNAL = -20999,
+  TSM_ERR_BESSEL_ARGUMENTS = -23039,
+
+  /* warnings: results are valid */
+  TSM_WARN_LENGTH_NOT_POSITIVE = 20002,
+  TSM_WARN_NEAR_SINGULAR = 20003,
+  TSM_WARN_LENGTHS_DIFFER = 20004,
+  TSM_WARN_UNRELIABLE = 20005,
+  TSM_WARN_PRECISION_LOST = 20006,
+  TSM_WARN_ITERATION_LIMIT = 20010,
+  TSM_WARN_DEGENERATE_WEIGHTS = 20030,
+  TSM_WARN_ILL_CONDITIONED_FIT = 20031
+};
+
+#endif

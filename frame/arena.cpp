@@ -1,8 +1,8 @@
 // Lock-free bump arena. Every operation on `count`, `top` and the header
-// words is an atomic read-modify-write (a full barrier), in this order:
-// allocation bumps `top`, then writes the header, then counts the block; free
-// merges into the next block's `start`, reads `top`, uncounts, then swaps
-// `top` down. The only lock is the short critical section of the owner test.
+// words is atomic and sequentially consistent, in this order: allocation
+// counts the block, bumps `top`, then writes the header; free merges into the
+// next block's `start`, reads `top`, uncounts, then swaps `top` down. The
+// only lock is the short critical section of the owner test.
 #include "frame/arena.h"
 
 #include <pthread.h>
@@ -25,12 +25,28 @@ bool OwnerAdmits() {
   return reinterpret_cast<std::uintptr_t>(pthread_self()) == gArena.owner;
 }
 
+// Uncounts a block. When the count reaches 0 nothing is live or under way,
+// and `top` goes back to the base unless another thread moved it meanwhile.
+// Returns whether the count reached 0.
+bool Uncount() {
+  std::uintptr_t seenTop = gArena.top.load();
+  if (gArena.count.fetch_sub(1) != 1) return false;
+  gArena.top.compare_exchange_strong(seenTop, gArena.base.load());
+  return true;
+}
+
 ErrorCode Allocate(void** out, std::uintptr_t n) {
   *out = nullptr;
   if (!OwnerAdmits()) throw long{TSM_ERR_ARENA_OWNER};
+  // The block is counted before `top` moves: a free that sees the count reach
+  // 0 may then reset `top` to the base only while no allocation is under way
+  // (counting after the bump would let a reset slip in between and hand the
+  // new block's space out twice).
+  gArena.count.fetch_add(1);
   const std::uintptr_t span = ArenaSpan(n);
   const std::uintptr_t block = gArena.top.fetch_add(span);
   if (block == 0) {  // no buffer: only reachable past the front, which needs an arena to be enabled
+    gArena.count.fetch_sub(1);
     *out = reinterpret_cast<void*>(kArenaHeader);
     return TSM_SUCCESS;
   }
@@ -38,12 +54,13 @@ ErrorCode Allocate(void** out, std::uintptr_t n) {
   if (newTop >= gArena.limit.load()) {
     // Nothing is written for a request that does not fit: concurrent failing
     // requests may push `top` well past the buffer before it is set back.
+    // `top` stays at the limit until the count next reaches 0.
     gArena.top.compare_exchange_strong(newTop, gArena.limit.load());
+    Uncount();
     throw long{TSM_ERR_ARENA_EXHAUSTED};
   }
   Word(block).exchange(block);
-  Word(block + sizeof(std::uintptr_t)).store(newTop, std::memory_order_relaxed);
-  gArena.count.fetch_add(1);
+  Word(block + sizeof(std::uintptr_t)).store(newTop);
   *out = reinterpret_cast<void*>(block + kArenaHeader);
   return TSM_SUCCESS;
 }
@@ -65,11 +82,7 @@ void ArenaFree(void* p) {
   const std::uintptr_t start = Word(header).load();
   const std::uintptr_t end = Word(header + sizeof(std::uintptr_t)).load();
   Word(end).exchange(start);  // the next block now claims this block's space too
-  std::uintptr_t seenTop = gArena.top.load();
-  if (gArena.count.fetch_sub(1) == 1) {
-    // Last block: back to the base, unless another thread moved `top` meanwhile.
-    gArena.top.compare_exchange_strong(seenTop, gArena.base.load());
-  } else {
+  if (!Uncount()) {
     // Roll back when this block (with everything merged into it) is topmost.
     std::uintptr_t expected = end;
     gArena.top.compare_exchange_strong(expected, start);

@@ -21,8 +21,8 @@ inline constexpr uint32 kNoArena = 0xFFFFFFFFu;  // `count` while no arena exist
 inline constexpr std::uintptr_t kArenaHeader = 2 * sizeof(std::uintptr_t);
 inline constexpr std::uintptr_t kArenaSpare = 8;
 inline constexpr std::uintptr_t kArenaGrain = sizeof(std::uintptr_t);
-// Bytes behind `limit` in the buffer: room for the header words that an
-// allocation starting exactly at `limit` would address.
+// Bytes behind `limit` in the buffer: the free of the topmost block exchanges
+// the word at its end, which may lie just below `limit`.
 inline constexpr std::uintptr_t kArenaSlack = kArenaHeader + kArenaSpare;
 
 struct WorkspaceArena {

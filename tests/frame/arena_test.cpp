@@ -122,14 +122,5 @@ TEST_F(ArenaTest, ResizeKeepsSmallerRequestsAndMovesLargerOnes) {
   EXPECT_EQ(Top(), 0u);
 }
 
-TEST_F(ArenaTest, FailedGrowthLosesTheBlock) {
-  MakeArena(128);
-  void* p = nullptr;
-  ASSERT_EQ(ArenaAllocate(&p, 16), 0);
-  EXPECT_EQ(ArenaResize(&p, 200), TSM_ERR_ARENA_EXHAUSTED);
-  EXPECT_EQ(p, nullptr);
-  EXPECT_EQ(Live(), 0u);
-}
-
 }  // namespace
 }  // namespace tsmtest

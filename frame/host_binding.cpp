@@ -55,7 +55,10 @@ void* ProcessImageIfHost() {
   if (known != nullptr) return known;
   void* image = dlopen(nullptr, RTLD_LAZY);
   if (image == nullptr) return nullptr;
-  if (dlsym(image, "gTSRTVersion") == nullptr && dlsym(image, "AZNewHandle") == nullptr) return nullptr;
+  if (dlsym(image, "gTSRTVersion") == nullptr && dlsym(image, "AZNewHandle") == nullptr) {
+    dlclose(image);
+    return nullptr;
+  }
   gImageHost.store(image, std::memory_order_release);
   return image;
 }

@@ -3,7 +3,7 @@
 #include <cstring>
 #include <vector>
 
-#include "arena_fixture.h"
+#include "frame/arena_fixture.h"
 
 namespace tsmtest {
 namespace {

@@ -2,7 +2,7 @@
 // their birth mode across a workspace switched on and off.
 #include <cstring>
 
-#include "arena_fixture.h"
+#include "frame/arena_fixture.h"
 
 namespace tsmtest {
 namespace {

@@ -100,6 +100,26 @@ inline int RunFailingEachResize(const std::function<int32_t()>& call,
   return 64;
 }
 
-inline bool IsNaN(double v) { return std::isnan(v); }
+inline constexpr double kEps = 2.220446049250313e-16;
+
+// The library's NaN for a result that could not be computed: the quiet NaN
+// 0x7FF8000000000000 exactly.
+inline bool IsLibNaN(double v) {
+  std::uint64_t bits;
+  std::memcpy(&bits, &v, sizeof bits);
+  return bits == 0x7FF8000000000000ull;
+}
+
+// A form A entry with a scalar result, called with garbage in both outputs
+// beforehand: success must zero the error out-argument.
+struct Scalar {
+  int32_t ret, err;
+  double value;
+};
+inline Scalar CallScalar(const std::function<int32_t(double*, int32_t*)>& call) {
+  Scalar r{-1, 0x5A5A5A5A, 12345.0};
+  r.ret = call(&r.value, &r.err);
+  return r;
+}
 
 }  // namespace tsmtest

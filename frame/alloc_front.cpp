@@ -2,7 +2,6 @@
 #include <atomic>
 #include <cstdlib>
 #include <cstring>
-#include <mutex>
 #include <new>
 
 #include "frame/arena.h"
@@ -30,7 +29,8 @@ void (*gHookFree)(void*) = nullptr;
 
 void SetUpDefaultMode() {
   int32 unset = kModeUnset;
-  gDefaultMode.compare_exchange_strong(unset, kModeHeap);
+  if (gDefaultMode.load(std::memory_order_relaxed) == kModeUnset)
+    gDefaultMode.compare_exchange_strong(unset, kModeHeap);
 }
 
 int32 WantedMode() {
@@ -70,8 +70,8 @@ bool TotalFits(uint32 bytes) { return bytes <= 0xFFFFFFFFu - kFrontHeader; }
 // taken before the hook slots exist, hence the lazy heap mode above.
 struct LibraryLoad {
   LibraryLoad() {
-    void* lockBlock = AnalysisAllocPtr(sizeof(std::mutex));
-    gArena.ownerLock = lockBlock != nullptr ? new (lockBlock) std::mutex : nullptr;
+    void* lockBlock = AnalysisAllocPtr(sizeof(OwnerLock));
+    gArena.ownerLock = lockBlock != nullptr ? new (lockBlock) OwnerLock : nullptr;
     if (gArena.ownerLock == nullptr) std::abort();  // no memory while loading: nothing can run
     gArena.count.store(kNoArena);
     gHookAlloc = std::malloc;
@@ -80,7 +80,7 @@ struct LibraryLoad {
     gDefaultMode.store(kModeHooks);
   }
   ~LibraryLoad() {
-    gArena.ownerLock->~mutex();
+    gArena.ownerLock->~OwnerLock();
     AnalysisFree(gArena.ownerLock);
     gArena.ownerLock = nullptr;
   }

@@ -8,6 +8,7 @@
 #include <pthread.h>
 
 #include <cstring>
+#include <mutex>
 
 namespace tsm {
 
@@ -20,7 +21,7 @@ std::atomic_ref<std::uintptr_t> Word(std::uintptr_t address) {
 }
 
 bool OwnerAdmits() {
-  std::lock_guard<std::mutex> hold(*gArena.ownerLock);
+  std::lock_guard<OwnerLock> hold(*gArena.ownerLock);
   if (gArena.owner == 0) return true;
   return reinterpret_cast<std::uintptr_t>(pthread_self()) == gArena.owner;
 }
@@ -60,7 +61,7 @@ ErrorCode Allocate(void** out, std::uintptr_t n) {
     throw long{TSM_ERR_ARENA_EXHAUSTED};
   }
   Word(block).exchange(block);
-  Word(block + sizeof(std::uintptr_t)).store(newTop);
+  Word(block + sizeof(std::uintptr_t)).store(newTop, std::memory_order_relaxed);  // read by this block's owner only
   *out = reinterpret_cast<void*>(block + kArenaHeader);
   return TSM_SUCCESS;
 }

@@ -11,7 +11,7 @@
 
 #include <atomic>
 #include <cstdint>
-#include <mutex>
+#include <thread>
 
 #include "frame/types.h"
 
@@ -25,6 +25,20 @@ inline constexpr std::uintptr_t kArenaGrain = sizeof(std::uintptr_t);
 // the word at its end, which may lie just below `limit`.
 inline constexpr std::uintptr_t kArenaSlack = kArenaHeader + kArenaSpare;
 
+// The short critical section around the owner test: a test-and-set lock that
+// yields while another thread holds it (it is held for a few instructions).
+class OwnerLock {
+ public:
+  void lock() {
+    while (held_.exchange(true, std::memory_order_acquire))
+      while (held_.load(std::memory_order_relaxed)) std::this_thread::yield();
+  }
+  void unlock() { held_.store(false, std::memory_order_release); }
+
+ private:
+  std::atomic<bool> held_{false};
+};
+
 struct WorkspaceArena {
   std::atomic<uint32> count{kNoArena};  // live blocks
   std::atomic<std::uintptr_t> top{0};   // next free byte
@@ -32,7 +46,7 @@ struct WorkspaceArena {
   std::atomic<std::uintptr_t> limit{0};
   std::atomic<std::uint8_t> enabled{0};
   std::uintptr_t owner = 0;  // thread identity; 0 admits every thread and is never written
-  std::mutex* ownerLock = nullptr;
+  OwnerLock* ownerLock = nullptr;
 };
 
 extern WorkspaceArena gArena;

@@ -5,7 +5,10 @@
 //   tsdemo [path/to/libtsmath.so]
 #include <dlfcn.h>
 
+#include <algorithm>
 #include <cmath>
+#include <functional>
+#include <utility>
 #include <cstdio>
 #include <cstdlib>
 #include <cstring>
@@ -64,6 +67,36 @@ std::vector<double> Readings() {
     x[i] = (i % 97 == 0) ? 12.5 : 10.0 + 2.0 * std::sin(2 * M_PI * 50.0 * i / 1000.0 + 0.3) + noise;
   }
   return x;
+}
+
+// Three tones (50, 120 and 333 Hz at 1 kHz sampling, amplitudes 1, 0.5 and
+// 0.25) over 1000 samples: the strongest bins of the real FFT.
+void Spectrum() {
+  const int n = 1000;
+  std::vector<double> tones(n);
+  for (int i = 0; i < n; ++i) {
+    const double t = i / 1000.0;
+    tones[i] = std::sin(2 * M_PI * 50 * t) + 0.5 * std::sin(2 * M_PI * 120 * t + 1.0) +
+               0.25 * std::cos(2 * M_PI * 333 * t);
+  }
+  F64ArrayHdl x = NewArray<F64Array>(TSM_TYPE_F64, tones);
+  auto X = static_cast<CxArrayHdl>(tsrt_new_array(TSM_TYPE_CX128, 0, nullptr));
+  PlanHolder* state = nullptr;
+  const int32_t code = ENTRY(ReKWFFTH80)(x, X, &state, 0, n, 0);
+  std::printf("  spectrum of three tones (ReKWFFTH80, %d bins, code %d), strongest bins:\n", CountOf(X), code);
+  std::vector<std::pair<double, int>> bins;
+  for (int k = 0; k <= n / 2; ++k) {
+    double re, im;
+    std::memcpy(&re, reinterpret_cast<char*>(*X) + 4 + 16 * k, 8);
+    std::memcpy(&im, reinterpret_cast<char*>(*X) + 12 + 16 * k, 8);
+    bins.push_back({std::hypot(re, im) * 2 / n, k});
+  }
+  std::sort(bins.begin(), bins.end(), std::greater<>());
+  for (int i = 0; i < 4; ++i)
+    std::printf("    %4d Hz  amplitude %.12f\n", bins[i].second, bins[i].first);
+  std::printf("\n");
+  tsrt_dispose(x);
+  tsrt_dispose(X);
 }
 
 }  // namespace
@@ -162,10 +195,13 @@ int main(int argc, char** argv) {
                   static_cast<void*>(intervals), static_cast<void*>(empty), static_cast<void*>(bad)})
     tsrt_dispose(h);
 
+  Spectrum();
+
   ENTRY(DisableAnalysisWorkspaceH)(&err);
   ENTRY(UninitializeAnalysisWorkspaceH)(&err);
-  std::printf("workspace removed: status %u code %d; host blocks still live: %lld; clean-ups pending: %d\n",
-              err.status, err.code, static_cast<long long>(tsrt_live_blocks()), tsrt_cleanup_count());
-  tsrt_end_run();
+  std::printf("workspace removed: status %u code %d\n", err.status, err.code);
+  const int32_t ran = tsrt_end_run();  // the host ends its run: reserved plans are released
+  std::printf("host run ended: %d clean-up(s) ran; host blocks still live: %lld\n", ran,
+              static_cast<long long>(tsrt_live_blocks()));
   return err.status == 0 && tsrt_live_blocks() == 0 ? 0 : 1;
 }

@@ -66,6 +66,13 @@ typedef struct GenHistIntervalArray { int32_t count; GenHistInterval elt[1]; } G
  * first interval (below) and beyond the last (above). */
 typedef struct GenHistOutliers { int32_t total; int32_t below; int32_t above; } GenHistOutliers;
 
+/* Opaque records of the FFT engine: a cached plan, the holder of a plan kept
+ * between calls by a plain transform entry, and the two-slot record kept by
+ * an _IDP entry (released by TransformUnreserveProc). */
+typedef struct kwfft_table kwfft_table;
+typedef struct PlanHolder PlanHolder;
+typedef struct ReservedTransformState ReservedTransformState;
+
 typedef F64Array** F64ArrayHdl;
 typedef F32Array** F32ArrayHdl;
 typedef I32Array** I32ArrayHdl;

@@ -1,6 +1,6 @@
 /* Automatically generated from entries/exports.table, do not edit.
  * Regenerate: cmake -P tools/gen_exports.cmake
- * 17 exports. Included by tsmath.h inside its extern "C" block. */
+ * 36 exports. Included by tsmath.h inside its extern "C" block. */
 #ifndef TSMATH_EXPORTS_H
 #define TSMATH_EXPORTS_H
 
@@ -26,5 +26,26 @@ TSM_API int32_t RMS_head(F64ArrayHdl x, double* rms, int32_t* err);
 TSM_API int32_t CxRMS_head(CxArrayHdl x, double* rms);
 TSM_API int32_t GenHistH(F64ArrayHdl x, GenHistIntervalHdl intervals, I32ArrayHdl counts, GenHistOutliers* outliers, int32_t* err);
 TSM_API int32_t histgran_head(F64ArrayHdl x, int32_t* bins, I32ArrayHdl counts, F64ArrayHdl centres, int32_t* err);
+
+/* FFT plans and 1-D transforms */
+TSM_API kwfft_table* create_kwfft_table(int32_t n);
+TSM_API void destroy_kwfft_table(kwfft_table* plan);
+TSM_API int32_t TransformUnreserveProc(ReservedTransformState** state);
+TSM_API int32_t ReKWFFTH80(F64ArrayHdl x, CxArrayHdl X, PlanHolder** state, int32_t offset, int32_t fftSize, int32_t shift);
+TSM_API int32_t ReKWFFTH80_IDP(F64ArrayHdl x, CxArrayHdl X, ReservedTransformState** state, int32_t offset, int32_t fftSize, int32_t shift);
+TSM_API int32_t CxKWFFTH80(CxArrayHdl x, CxArrayHdl X, PlanHolder** state, int32_t offset, int32_t fftSize, int32_t shift);
+TSM_API int32_t CxKWFFTH80_IDP(CxArrayHdl x, CxArrayHdl X, ReservedTransformState** state, int32_t offset, int32_t fftSize, int32_t shift);
+TSM_API int32_t InvReKWFFTH80(CxArrayHdl X, F64ArrayHdl x, PlanHolder** state, int32_t shift);
+TSM_API int32_t InvReKWFFTH80_IDP(CxArrayHdl X, F64ArrayHdl x, ReservedTransformState** state, int32_t shift);
+TSM_API int32_t InvCxKWFFTH80(CxArrayHdl X, CxArrayHdl x, PlanHolder** state, int32_t shift);
+TSM_API int32_t InvCxKWFFTH80_IDP(CxArrayHdl X, CxArrayHdl x, ReservedTransformState** state, int32_t shift);
+TSM_API int32_t ReKWFFTHCH(F64ArrayHdl x, F64ArrayHdl y, PlanHolder** state);
+TSM_API int32_t ReKWFFTHCH_IDP(F64ArrayHdl x, F64ArrayHdl y, ReservedTransformState** state);
+TSM_API int32_t InvReKWFFTHCH(F64ArrayHdl y, F64ArrayHdl x, PlanHolder** state);
+TSM_API int32_t InvReKWFFTHCH_IDP(F64ArrayHdl y, F64ArrayHdl x, ReservedTransformState** state);
+TSM_API int32_t ReKWFFTH(F64ArrayHdl x, CxArrayHdl X, PlanHolder** state);
+TSM_API int32_t CxKWFFTH(CxArrayHdl x, CxArrayHdl X, PlanHolder** state);
+TSM_API int32_t InvReKWFFTH(CxArrayHdl X, F64ArrayHdl x, PlanHolder** state);
+TSM_API int32_t InvCxKWFFTH(CxArrayHdl X, CxArrayHdl x, PlanHolder** state);
 
 #endif

@@ -1,12 +1,16 @@
 #!/usr/bin/python3
-"""Generator of the straight-line DFT codelets of the FFT engine.
+"""Generator of the straight-line DFT codelets and passes of the FFT engine.
 
-Writes transforms/generated/kwfft_rN.cpp for every radix N of the engine, each
-with the complex codelet kwfft_cx_codelet_N and the real codelet
+Writes, for every radix N of the engine, transforms/generated/kwfft_rN.cpp with
+the complex codelet kwfft_cx_codelet_N and the real codelet
 kwfft_real_codelet_N (HalfComplex output) declared in
-transforms/kwfft_codelets.h. It prints the operation counts it measured against
-the budget of each radix and exits with status 1 if a codelet exceeds its
-budget by more than 10 %, or if a codelet fails its numerical check.
+transforms/kwfft_codelets.h, and transforms/generated/kwfft_passes_rN.cpp with
+the four passes of the radix (kwfft_cx_notw_N, kwfft_real_notw_N,
+kwfft_cx_tw_N, kwfft_real_tw_N; see transforms/kwfft_passes.h), declared in
+transforms/generated/kwfft_codelet_passes.h. It prints the operation counts it
+measured against the budget of each radix and exits with status 1 if a
+codelet exceeds its budget by more than 10 %, or if a codelet or pass body
+fails its numerical check.
 
     /usr/bin/python3 tools/gen_codelets.py
 
@@ -22,6 +26,14 @@ imaginary inputs set to zero, keeping only what HalfComplex stores; what is not
 reachable from a store is never emitted. A last pass chooses, for every
 addition, whether it computes its value or its negative, so that no
 subtraction needs an extra negation and every store takes a value as it is.
+
+The passes loop over blocks (leaf passes) or positions (twiddle passes) around
+the same DAG, with the loads of a twiddle pass multiplied by the twiddles of
+their row as they are made; the real twiddle pass has two more bodies of its
+own, for the pair of positions k, m - k and for the middle position (see Body).
+The pass bodies are emitted in an order that keeps few values live (see
+Body.schedule): GCC on x86-64 assigns registers about in the order of the
+source, and with 16 registers a loads-first order spills heavily.
 
 Methods, by radix:
   2, 4, 8, 16  split radix: the even outputs by the half-length transform of
@@ -830,25 +842,59 @@ def comment_wrap(text, width=100):
     return lines + [cur]
 
 
-# ---- codelets: build, fix signs, count, check, emit ---------------------------
+# ---- bodies: build, fix signs, count, check ------------------------------------
+
+# A body is one DFT of radix r as straight-line code: which inputs are real, and
+# which outputs are stored where. Each store names the bin it holds, as
+# (bin t, part 0 for Re or 1 for Im, sign).
+#   cx    r complex inputs, all outputs: the complex codelet and passes.
+#   real  r real inputs, HalfComplex outputs: the real codelet and leaf pass.
+#   pair  the real twiddle pass at positions k and m - k, 0 < k < m/2. Output t
+#         is bin q = k + t m of the block of r m; q < r m / 2 exactly when
+#         2t < r, so the pattern is fixed: then Re X[t] goes to position k of
+#         block t ("lo" slot t) and Im X[t] to position m - k of block r - 1 - t
+#         ("hi" slot r - 1 - t); otherwise Re X[t] to hi slot r - 1 - t and
+#         -Im X[t] to lo slot t.
+#   mid   the middle position m/2 of the real twiddle pass for even m: x[0] is
+#         real; for 2t + 1 < r Re X[t] goes to slot t and Im X[t] to slot
+#         r - 1 - t, for 2t + 1 = r only Re X[t] to slot t; the rest is the
+#         conjugate half, not stored.
 
 
-class Codelet:
-    def __init__(self, r, real):
+class Body:
+    def __init__(self, r, shape):
         global DAG
         DAG = Dag()
-        self.r, self.real = r, real
-        if real:
+        self.r, self.shape = r, shape
+        self.real = shape == "real"
+        if shape == "real":
             xs = [(DAG.load("in", k), ZERO) for k in range(r)]
+        elif shape == "mid":
+            xs = [(DAG.load("in_re", 0), ZERO)] + [(DAG.load("in_re", k), DAG.load("in_im", k)) for k in range(1, r)]
         else:
             xs = [(DAG.load("in_re", k), DAG.load("in_im", k)) for k in range(r)]
         out = dft(xs)
-        if real:
-            self.stores = [("out", k, out[k][0]) for k in range(r // 2 + 1)]
-            self.stores += [("out", r - k, out[k][1]) for k in range(1, (r + 1) // 2)]
-            self.stores.sort(key=lambda t: t[1])
+        stores = []
+        if shape == "real":
+            stores = [("out", k, out[k][0], (k, 0, 1)) for k in range(r // 2 + 1)]
+            stores += [("out", r - k, out[k][1], (k, 1, 1)) for k in range(1, (r + 1) // 2)]
+            stores.sort(key=lambda t: t[1])
+        elif shape == "cx":
+            stores = [(arr, k, out[k][part], (k, part, 1))
+                      for k in range(r) for part, arr in enumerate(("out_re", "out_im"))]
+        elif shape == "pair":
+            for t in range(r):
+                if 2 * t < r:
+                    stores += [("lo", t, out[t][0], (t, 0, 1)), ("hi", r - 1 - t, out[t][1], (t, 1, 1))]
+                else:
+                    stores += [("hi", r - 1 - t, out[t][0], (t, 0, 1)), ("lo", t, -out[t][1], (t, 1, -1))]
         else:
-            self.stores = [(arr, k, out[k][part]) for k in range(r) for part, arr in enumerate(("out_re", "out_im"))]
+            for t in range((r + 1) // 2):
+                stores.append(("mid", t, out[t][0], (t, 0, 1)))
+                if 2 * t + 1 < r:
+                    stores.append(("mid", r - 1 - t, out[t][1], (t, 1, 1)))
+        self.stores = [(arr, k, e) for arr, k, e, _ in stores]
+        self.wants = [w for _, _, _, w in stores]
         self.dag = DAG
         self.live = self._live()
         self._choose_signs()
@@ -950,39 +996,160 @@ class Codelet:
         return {(arr, k): e.sign * self._fsign(e.node) * val[e.node.id] for arr, k, e in self.stores}
 
     def check(self):
-        rng = random.Random(self.r * 2 + self.real)
+        rng = random.Random(f"{self.r} {self.shape}")
         r = self.r
         for _ in range(2):
             x = [complex(rng.uniform(-1, 1), 0 if self.real else rng.uniform(-1, 1)) for _ in range(r)]
-            if self.real:
-                inputs = {("in", k): x[k].real for k in range(r)}
-            else:
-                inputs = {("in_re", k): x[k].real for k in range(r)}
-                inputs.update({("in_im", k): x[k].imag for k in range(r)})
+            if self.shape == "mid":
+                x[0] = complex(x[0].real, 0)
+            inputs = {}
+            for k in range(r):
+                if self.real:
+                    inputs[("in", k)] = x[k].real
+                else:
+                    inputs[("in_re", k)], inputs[("in_im", k)] = x[k].real, x[k].imag
             got = self.run(inputs)
-            for arr, k, _ in self.stores:
-                kk = k if arr != "out" or k <= r // 2 else r - k
-                want = sum(x[t] * complex(math.cos(2 * math.pi * kk * t / r), -math.sin(2 * math.pi * kk * t / r))
-                           for t in range(r))
-                want = want.imag if arr == "out_im" or (arr == "out" and k > r // 2) else want.real
+            for (arr, k, _), (t, part, sign) in zip(self.stores, self.wants):
+                want = sum(x[u] * complex(math.cos(2 * math.pi * t * u / r), -math.sin(2 * math.pi * t * u / r))
+                           for u in range(r))
+                want = sign * (want.imag if part else want.real)
                 if abs(got[(arr, k)] - want) > 1e-12 * r:
-                    sys.exit(f"radix {r}{' real' if self.real else ''}: output {arr}[{k}] is wrong")
+                    sys.exit(f"radix {r} {self.shape}: output {arr}[{k}] is wrong")
 
-    def emit(self, names):
-        r = self.r
-        if self.real:
-            head = f"void kwfft_real_codelet_{r}(const f64* in, f64* out, std::ptrdiff_t is, std::ptrdiff_t os) {{"
-        else:
-            head = (f"void kwfft_cx_codelet_{r}(const f64* in_re, const f64* in_im, f64* out_re, f64* out_im,\n"
-                    + " " * (len(f"void kwfft_cx_codelet_{r}(")) + "std::ptrdiff_t is, std::ptrdiff_t os) {")
-        lines = [head]
-        var = {}
-        temps = 0
+    # Stores write over the inputs of the same slot when a body runs in place.
+    SLOT_LOADS = {"out_re": "in_re", "out_im": "in_im", "out": "in", "lo": "in_re", "hi": "in_im", "mid": "in_re"}
+
+    def schedule(self, grouped):
+        """An order of loads, operations and stores that keeps few values live,
+        since GCC assigns registers about in the order of the source. List
+        scheduling: take the ready operation that ends the most live values,
+        ties going to the one whose operands were made last; when each ready
+        operation would only add a value, load the inputs of the operation that
+        needs the fewest new values instead, if that is cheaper. A store follows
+        its value at once, but never precedes the load of its own slot. With
+        grouped, x[j] (j > 0) is loaded as one (both parts, twiddled).
+
+        Returns a list of ("load", key), ("op", node) and ("store", index)."""
+        def ops(n):
+            return () if n.op == "load" else tuple({n.a.id: 0, n.b.id: 0}) if n.op == "add" else (n.a.id,)
+
+        byid = {n.id: n for n in self.live}
+        cons = {n.id: [] for n in self.live}
+        for n in self.live:
+            for o in ops(n):
+                cons[o].append(n)
+        pending = {n.id: len(cons[n.id]) for n in self.live}
+        stores_of = {}
+        for i, (_, _, e) in enumerate(self.stores):
+            pending[e.node.id] += 1
+            stores_of.setdefault(e.node.id, []).append(i)
+        load_of = {n.where: n.id for n in self.live if n.op == "load"}
+        slot_load = [load_of.get((self.SLOT_LOADS[arr], k)) for arr, k, _ in self.stores]
+        members = {}
         for n in self.live:
             if n.op == "load":
-                arr, k = n.where
-                var[n.id] = f"x{k}" if arr == "in" else f"x{k}{arr[-2]}"
-                lines.append(f"  const double {var[n.id]} = {arr}[{index(k, 'is')}];")
+                arr, j = n.where
+                key = ("x", j) if grouped and j > 0 and arr != "in" else n.where
+                members.setdefault(key, []).append(n.id)
+        group_of = {i: key for key, ids in members.items() for i in ids}
+
+        seq, made, waiting, ready = [], {}, {}, set()
+
+        def make(n):
+            made[n.id] = len(made)
+            for o in ops(n):
+                pending[o] -= 1
+            for c in cons[n.id]:
+                if all(o in made for o in ops(c)):
+                    ready.add(c.id)
+            for i in stores_of.get(n.id, []):
+                if slot_load[i] is None or slot_load[i] in made:
+                    seq.append(("store", i))
+                    pending[n.id] -= 1
+                else:
+                    waiting.setdefault(slot_load[i], []).append(i)
+            for i in waiting.pop(n.id, []):
+                seq.append(("store", i))
+                pending[self.stores[i][2].node.id] -= 1
+
+        def load(key):
+            seq.append(("load", key))
+            for i in members[key]:
+                make(byid[i])
+
+        left = sum(1 for n in self.live if n.op != "load")
+        while left:
+            best = None
+            for i in ready:
+                n = byid[i]
+                cost = 1 - sum(1 for o in ops(n) if pending[o] == 1)
+                rank = (cost, -max(made[o] for o in ops(n)), n.id)
+                if best is None or rank < best[0]:
+                    best = (rank, n)
+            if best is None or best[0][0] > 0:
+                cand = None
+                for n in self.live:
+                    if n.op == "load" or n.id in made or n.id in ready:
+                        continue
+                    missing = [o for o in ops(n) if o not in made]
+                    if any(byid[o].op != "load" for o in missing):
+                        continue
+                    groups = {group_of[o] for o in missing}
+                    cost = sum(len(members[g]) for g in groups) + 1 - sum(
+                        1 for o in ops(n) if o in made and pending[o] == 1)
+                    recent = max([made[o] for o in ops(n) if o in made] or [-1])
+                    rank = (cost, -recent, n.id)
+                    if cand is None or rank < cand[0]:
+                        cand = (rank, groups)
+                if cand is not None and (best is None or cand[0][0] < best[0][0]):
+                    for g in sorted(cand[1]):
+                        load(g)
+                    continue
+            seq.append(("op", best[1]))
+            ready.discard(best[1].id)
+            make(best[1])
+            left -= 1
+        assert not waiting and len([x for x in seq if x[0] == "store"]) == len(self.stores)
+        return seq
+
+    def emit_scheduled(self, names, load_lines, target, indent, grouped):
+        """The body in the order of schedule(): load_lines(key) gives the lines
+        of a load (or of a twiddled x[j]), target(array, k) a store's place."""
+        lines, var, temps = [], {}, 0
+        for n in self.live:
+            if n.op == "load":
+                var[n.id] = self.load_name(n)
+        for kind, x in self.schedule(grouped):
+            if kind == "load":
+                lines += load_lines(x)
+            elif kind == "store":
+                arr, k, e = self.stores[x]
+                s = e.sign * self._fsign(e.node)
+                lines.append(f"{indent}{target(arr, k)} = {'' if s > 0 else '-'}{var[e.node.id]};")
+            else:
+                n = x
+                var[n.id] = f"t{temps}"
+                temps += 1
+                if n.op == "mul":
+                    rhs = f"{names[n.key]} * {var[n.a.id]}"
+                else:
+                    sa, sb = self._coeffs(n)
+                    a, b = var[n.a.id], var[n.b.id]
+                    rhs = {(1, 1): f"{a} + {b}", (1, -1): f"{a} - {b}", (-1, 1): f"{b} - {a}",
+                           (-1, -1): f"-({a} + {b})"}[(sa, sb)]
+                lines.append(f"{indent}const double {var[n.id]} = {rhs};")
+        return lines
+
+    def load_name(self, n):
+        arr, k = n.where
+        return f"x{k}" if arr == "in" else f"x{k}{arr[-2]}"
+
+    def emit_core(self, names, target, indent):
+        """The arithmetic and the stores, after the loads into x<k>, x<k>r, x<k>i."""
+        lines, var, temps = [], {}, 0
+        for n in self.live:
+            if n.op == "load":
+                var[n.id] = self.load_name(n)
                 continue
             var[n.id] = f"t{temps}"
             temps += 1
@@ -993,10 +1160,29 @@ class Codelet:
                 a, b = var[n.a.id], var[n.b.id]
                 rhs = {(1, 1): f"{a} + {b}", (1, -1): f"{a} - {b}", (-1, 1): f"{b} - {a}",
                        (-1, -1): f"-({a} + {b})"}[(sa, sb)]
-            lines.append(f"  const double {var[n.id]} = {rhs};")
+            lines.append(f"{indent}const double {var[n.id]} = {rhs};")
         for arr, k, e in self.stores:
             s = e.sign * self._fsign(e.node)
-            lines.append(f"  {arr}[{index(k, 'os')}] = {'' if s > 0 else '-'}{var[e.node.id]};")
+            lines.append(f"{indent}{target(arr, k)} = {'' if s > 0 else '-'}{var[e.node.id]};")
+        return lines
+
+    def live_loads(self):
+        return {n.where for n in self.live if n.op == "load"}
+
+    def emit(self, names):
+        """The codelet: loads at stride is, stores at stride os."""
+        r = self.r
+        if self.real:
+            head = f"void kwfft_real_codelet_{r}(const f64* in, f64* out, std::ptrdiff_t is, std::ptrdiff_t os) {{"
+        else:
+            head = (f"void kwfft_cx_codelet_{r}(const f64* in_re, const f64* in_im, f64* out_re, f64* out_im,\n"
+                    + " " * (len(f"void kwfft_cx_codelet_{r}(")) + "std::ptrdiff_t is, std::ptrdiff_t os) {")
+        lines = [head]
+        for n in self.live:
+            if n.op == "load":
+                arr, k = n.where
+                lines.append(f"  const double {self.load_name(n)} = {arr}[{index(k, 'is')}];")
+        lines += self.emit_core(names, lambda arr, k: f"{arr}[{index(k, 'os')}]", "  ")
         lines.append("}")
         return lines
 
@@ -1012,9 +1198,9 @@ def decimal17(c):
     return text
 
 
-def constant_names(codelets):
+def constant_names(bodies):
     names, used = {}, set()
-    for cl in codelets:
+    for cl in bodies:
         for n in cl.live:
             if n.op == "mul" and n.key not in names:
                 name = n.hint if n.hint == "kBase" else KNOWN_NAMES.get(n.key, n.hint)
@@ -1033,14 +1219,25 @@ def natural(name):
 
 
 COMMAND = "/usr/bin/python3 tools/gen_codelets.py"
+GENERATED_HEAD = [
+    "// automatically generated, do not edit",
+    f"// regenerate from the repository root with: {COMMAND}",
+]
+
+
+def constant_lines(names, consts):
+    if not names:
+        return []
+    lines = ["namespace {", ""]
+    for key, name in sorted(names.items(), key=lambda kv: natural(kv[1])):
+        lines.append(f"constexpr double {name} = {decimal17(consts[key])};")
+    return lines + ["", "}  // namespace"]
 
 
 def write_file(path, r, cx, re_):
     names = constant_names((cx, re_))
     consts = cx.dag.consts | re_.dag.consts
-    lines = [
-        "// automatically generated, do not edit",
-        f"// regenerate from the repository root with: {COMMAND}",
+    lines = GENERATED_HEAD + [
         "//",
         f"// DFT of length {r}, X[k] = sum_t x[t] exp(-2 pi i k t / {r}), unscaled.",
     ]
@@ -1056,15 +1253,204 @@ def write_file(path, r, cx, re_):
         lines.append(f"//   {fn:<24} {a:5d} additions {m:4d} multiplications {c:4d} constants "
                      f"{ld:3d} loads {st:3d} stores")
     lines += ["", "#include <cstddef>", "", '#include "transforms/kwfft_codelets.h"', "", "namespace tsm {"]
-    if names:
-        lines += ["namespace {", ""]
-        for key, name in sorted(names.items(), key=lambda kv: natural(kv[1])):
-            lines.append(f"constexpr double {name} = {decimal17(consts[key])};")
-        lines += ["", "}  // namespace"]
+    lines += constant_lines(names, consts)
     lines.append("")
     lines += cx.emit(names)
     lines.append("")
     lines += re_.emit(names)
+    lines += ["", "}  // namespace tsm", ""]
+    with open(path, "w") as fh:
+        fh.write("\n".join(lines))
+
+
+# ---- passes: the bodies in loops over blocks and positions ---------------------
+
+# Signatures of the four passes (those of transforms/kwfft_passes.h).
+def pass_signatures(r):
+    sig = {
+        "cx_notw": "(const f64* in_re, const f64* in_im, f64* out_re, f64* out_im, std::ptrdiff_t is, "
+                   "std::ptrdiff_t os, int32 count)",
+        "real_notw": "(const f64* in, f64* out, std::ptrdiff_t is, std::ptrdiff_t os, int32 count)",
+        "cx_tw": "(f64* re, f64* im, const f64* tw_cos, const f64* tw_sin, std::ptrdiff_t stride, int32 m)",
+        "real_tw": "(f64* data, const f64* tw_cos, const f64* tw_sin, std::ptrdiff_t stride, int32 m)",
+    }
+    return [(f"kwfft_{kind}_{r}", args) for kind, args in sig.items()]
+
+
+def declaration(name, args, tail, width=118):
+    """void name(args)tail, wrapped after a comma with the arguments aligned."""
+    first = f"void {name}("
+    lines, cur = [], first
+    for i, part in enumerate(args[1:-1].split(", ")):
+        piece = part + (", " if i < args.count(",") else ")" + tail)
+        if len(cur) + len(piece.rstrip()) > width and cur.strip() != first.strip():
+            lines.append(cur.rstrip())
+            cur = " " * len(first)
+        cur += piece
+    return lines + [cur]
+
+
+def twiddled_load(body, at, row, indent):
+    """Lines of one load of a twiddle pass: x[0] as it is, x[j] (key ("x", j))
+    times the twiddle j - 1 of the row: (a + i b)(c + i d), d the stored
+    negative sine; in the middle body x[j] = a is real."""
+    live = body.live_loads()
+
+    def lines(key):
+        arr, j = key
+        if arr != "x":
+            part = 0 if arr == "in_re" else 1
+            return [f"{indent}const double x0{'ri'[part]} = {at(part, 0)};"]
+        want_re, want_im = ("in_re", j) in live, ("in_im", j) in live
+        if body.shape == "mid":
+            out = [f"{indent}const double a{j} = {at(0, j)};"]
+            if want_re:
+                out.append(f"{indent}const double x{j}r = a{j} * {row[0]}[{j - 1}];")
+            if want_im:
+                out.append(f"{indent}const double x{j}i = a{j} * {row[1]}[{j - 1}];")
+            return out
+        out = [f"{indent}const double a{j} = {at(0, j)}, b{j} = {at(1, j)};",
+               f"{indent}const double c{j} = {row[0]}[{j - 1}], d{j} = {row[1]}[{j - 1}];"]
+        if want_re:
+            out.append(f"{indent}const double x{j}r = a{j} * c{j} - b{j} * d{j};")
+        if want_im:
+            out.append(f"{indent}const double x{j}i = a{j} * d{j} + b{j} * c{j};")
+        return out
+    return lines
+
+
+def pass_counts(body, twiddled):
+    """Additions, multiplications, loads (data and twiddles) and stores of one
+    iteration of a pass around body."""
+    a, m, _, ld, st = body.counts()
+    if twiddled:
+        live = body.live_loads()
+        for j in range(1, body.r):
+            parts = (("in_re", j) in live) + (("in_im", j) in live)
+            if body.shape == "mid":  # one real load a times the twiddle loads c, d
+                m, ld = m + parts, ld + (parts > 0)
+            else:
+                a, m, ld = a + parts, m + 2 * parts, ld + 2
+    return a, m, ld, st
+
+
+def write_pass_file(path, r, cx, re_, pair, mid):
+    names = constant_names((cx, re_, pair, mid))
+    consts = cx.dag.consts | re_.dag.consts | pair.dag.consts | mid.dag.consts
+    rows = [
+        (f"kwfft_cx_notw_{r}", "per block", pass_counts(cx, False)),
+        (f"kwfft_real_notw_{r}", "per block", pass_counts(re_, False)),
+        (f"kwfft_cx_tw_{r}", "per position k > 0", pass_counts(cx, True)),
+        (f"kwfft_real_tw_{r}", "per pair k, m - k", pass_counts(pair, True)),
+        (f"kwfft_real_tw_{r}", "middle, even m", pass_counts(mid, True)),
+    ]
+    lines = GENERATED_HEAD + [
+        "//",
+        f"// The four passes of radix {r} (see transforms/kwfft_passes.h): the DFT bodies",
+        f"// of kwfft_r{r}.cpp in loops over blocks (leaf passes) and positions (twiddle",
+        "// passes), with the twiddle products taken as the values are loaded.",
+        "//",
+        "// Operations measured by the generator, per iteration (twiddle products",
+        "// included; loads include the twiddles):",
+    ]
+    for fn, what, (a, m, ld, st) in rows:
+        lines.append(f"//   {fn:<19} {what:<19} {a:5d} additions {m:4d} multiplications "
+                     f"{ld:3d} loads {st:3d} stores")
+    lines += ["", "#include <cstddef>", "", '#include "transforms/generated/kwfft_codelet_passes.h"',
+              '#include "transforms/kwfft_codelets.h"', "", "namespace tsm {"]
+    lines += constant_lines(names, consts)
+    sigs = dict((name.split("_", 1)[1].rsplit("_", 1)[0], (name, args)) for name, args in pass_signatures(r))
+    w = r - 1
+    ind = "    "
+
+    def plain(arr):
+        return lambda a, k: f"{arr}[{index(k, 'os')}]"
+
+    # Leaf passes: block i reads at in + i is with stride is * count and writes
+    # r outputs at out + i r os.
+    name, args = sigs["cx_notw"]
+    lines += [""] + declaration(name, args, " {") + [
+        "  const std::ptrdiff_t s = is * count;",
+        f"  for (int32 i = 0; i < count; ++i, in_re += is, in_im += is, out_re += {r} * os, out_im += {r} * os) {{",
+    ]
+    lines += cx.emit_scheduled(names, lambda key: [f"{ind}const double x{key[1]}{key[0][-2]} = "
+                                                   f"{key[0]}[{index(key[1], 's')}];"],
+                               lambda arr, k: f"{arr}[{index(k, 'os')}]", ind, False) + ["  }", "}"]
+
+    name, args = sigs["real_notw"]
+    lines += [""] + declaration(name, args, " {") + [
+        "  const std::ptrdiff_t s = is * count;",
+        f"  for (int32 i = 0; i < count; ++i, in += is, out += {r} * os) {{",
+    ]
+    lines += re_.emit_scheduled(names, lambda key: [f"{ind}const double x{key[1]} = in[{index(key[1], 's')}];"],
+                                lambda arr, k: f"out[{index(k, 'os')}]", ind, False) + ["  }", "}"]
+
+    # Complex twiddle pass: position 0 by the codelet, then position k of the
+    # r blocks (s apart) with the twiddles of row k.
+    name, args = sigs["cx_tw"]
+    lines += [""] + declaration(name, args, " {") + [
+        "  const std::ptrdiff_t s = stride * m;",
+        f"  kwfft_cx_codelet_{r}(re, im, re, im, s, s);",
+        "  const f64* wc = tw_cos;",
+        "  const f64* ws = tw_sin;",
+        f"  for (int32 k = 1; k < m; ++k, wc += {w}, ws += {w}) {{",
+        f"{ind}f64* const pr = re + k * stride;",
+        f"{ind}f64* const pi = im + k * stride;",
+    ]
+    lines += cx.emit_scheduled(
+        names, twiddled_load(cx, lambda part, j: f"{('pr', 'pi')[part]}[{index(j, 's')}]", ("wc", "ws"), ind),
+        lambda arr, k: f"{'pr' if arr == 'out_re' else 'pi'}[{index(k, 's')}]", ind, True)
+    lines += ["  }", "}"]
+
+    # Real twiddle pass over r HalfComplex blocks of m: position 0 by the real
+    # codelet; the pair k, m - k holds complex element j as (position k,
+    # position m - k) of block j; the middle position of an even m holds real
+    # values.
+    name, args = sigs["real_tw"]
+    lines += [""] + declaration(name, args, " {") + [
+        "  const std::ptrdiff_t s = stride * m;",
+        f"  kwfft_real_codelet_{r}(data, data, s, s);",
+        "  const f64* wc = tw_cos;",
+        "  const f64* ws = tw_sin;",
+        f"  for (int32 k = 1; 2 * k < m; ++k, wc += {w}, ws += {w}) {{",
+        f"{ind}f64* const lo = data + k * stride;",
+        f"{ind}f64* const hi = data + (m - k) * stride;",
+    ]
+    lines += pair.emit_scheduled(
+        names, twiddled_load(pair, lambda part, j: f"{('lo', 'hi')[part]}[{index(j, 's')}]", ("wc", "ws"), ind),
+        lambda arr, k: f"{arr}[{index(k, 's')}]", ind, True)
+    lines += ["  }", "  if (m % 2 == 0) {",
+              f"{ind}f64* const mid = data + (m / 2) * stride;",
+              f"{ind}const f64* const wc_mid = tw_cos + static_cast<std::ptrdiff_t>(m / 2 - 1) * {w};",
+              f"{ind}const f64* const ws_mid = tw_sin + static_cast<std::ptrdiff_t>(m / 2 - 1) * {w};"]
+    lines += mid.emit_scheduled(
+        names, twiddled_load(mid, lambda part, j: f"mid[{index(j, 's')}]", ("wc_mid", "ws_mid"), ind),
+        lambda arr, k: f"mid[{index(k, 's')}]", ind, True)
+    lines += ["  }", "}", "", "}  // namespace tsm", ""]
+    with open(path, "w") as fh:
+        fh.write("\n".join(lines))
+    return rows
+
+
+def write_pass_header(path):
+    lines = GENERATED_HEAD + [
+        "//",
+        "// The passes of every radix with codelets, generated into kwfft_passes_rN.cpp:",
+        "// for radix N, kwfft_cx_notw_N, kwfft_real_notw_N, kwfft_cx_tw_N and",
+        "// kwfft_real_tw_N, with the signatures and meaning of CxNotwPass, RealNotwPass,",
+        "// CxTwPass and RealTwPass (transforms/kwfft_passes.h).",
+        "#pragma once",
+        "",
+        "#include <cstddef>",
+        "",
+        '#include "frame/types.h"',
+        "",
+        "namespace tsm {",
+    ]
+    for r in RADICES:
+        lines.append("")
+        for name, args in pass_signatures(r):
+            lines += declaration(name, args, ";")
     lines += ["", "}  // namespace tsm", ""]
     with open(path, "w") as fh:
         fh.write("\n".join(lines))
@@ -1075,10 +1461,12 @@ def main():
     root = os.path.dirname(os.path.dirname(os.path.abspath(__file__)))
     outdir = os.path.join(root, "transforms", "generated")
     os.makedirs(outdir, exist_ok=True)
-    rows, over = [], []
+    rows, over, pass_rows = [], [], []
     for r in RADICES:
-        cx, re_ = Codelet(r, False), Codelet(r, True)
+        cx, re_ = Body(r, "cx"), Body(r, "real")
         write_file(os.path.join(outdir, f"kwfft_r{r}.cpp"), r, cx, re_)
+        pair, mid = Body(r, "pair"), Body(r, "mid")
+        pass_rows.append((r, write_pass_file(os.path.join(outdir, f"kwfft_passes_r{r}.cpp"), r, cx, re_, pair, mid)))
         ca, cm, cc, _, _ = cx.counts()
         ra, rm, rc, _, _ = re_.counts()
         budget = BUDGET.get(r)
@@ -1087,13 +1475,17 @@ def main():
             for got, want, what in zip((ca, cm, ra, rm), budget, ("cx adds", "cx muls", "real adds", "real muls")):
                 if got > want * 1.1:
                     over.append(f"radix {r}: {what} {got} > 110% of {want}")
+    write_pass_header(os.path.join(outdir, "kwfft_codelet_passes.h"))
     print("radix   cx adds   (budget)  cx muls  (budget)  real adds (budget)  real muls (budget)  consts  negations")
     for r, got, budget, consts, negs in rows:
         cells = []
         for i, g in enumerate(got):
             cells.append(f"{g:6d} ({budget[i]:5d})" if budget else f"{g:6d} (    -)")
         print(f"{r:5d}  " + "   ".join(cells) + f"  {consts:6d}  {negs:4d}")
-    print(f"generated {len(RADICES)} files in {outdir} in {time.time() - start:.1f} s")
+    print("\nradix   adds/muls per iteration: cx tw      real tw pair    real tw middle")
+    for r, prow in pass_rows:
+        print(f"{r:5d}  " + "".join(f"{a:14d}/{m:<4d}" for _, _, (a, m, _, _) in prow[2:]))
+    print(f"generated {2 * len(RADICES) + 1} files in {outdir} in {time.time() - start:.1f} s")
     if over:
         print("\n".join(over))
         sys.exit(1)

@@ -1,8 +1,9 @@
-// Pass family: kind-0 passes around the generated codelets, the generic odd
-// pass over a root table (kind 1) and Rader's pass over a nested plan (kind 2).
+// Pass family: the generated kind-0 passes of each radix, the generic odd pass
+// over a root table (kind 1) and Rader's pass over a nested plan (kind 2).
 #include "transforms/kwfft_passes.h"
 
 #include "frame/workspace.h"
+#include "transforms/generated/kwfft_codelet_passes.h"
 #include "transforms/kwfft.h"
 
 namespace tsm {
@@ -12,21 +13,9 @@ using std::ptrdiff_t;
 
 constexpr int kMaxCodeletRadix = 43;
 
-// A DFT of one radix with strided input and output, possibly in place, as a
-// policy for the pass templates: Cx for complex data, Real for real data into
-// HalfComplex. Returns a code (scratch failures of kinds 1 and 2).
-struct CodeletDft {
-  CxCodelet cx_codelet;
-  RealCodelet real_codelet;
-  ErrorCode Cx(const f64* ir, const f64* ii, f64* or_, f64* oi, ptrdiff_t is, ptrdiff_t os) const {
-    cx_codelet(ir, ii, or_, oi, is, os);
-    return TSM_SUCCESS;
-  }
-  ErrorCode Real(const f64* in, f64* out, ptrdiff_t is, ptrdiff_t os) const {
-    real_codelet(in, out, is, os);
-    return TSM_SUCCESS;
-  }
-};
+// The pass templates below take a DFT of one radix with strided input and
+// output, possibly in place, as a policy: Cx for complex data, Real for real
+// data into HalfComplex, each returning a code (scratch failures).
 
 // Generic odd DFT over the root table: sums and differences of elements k
 // and r-k, then each pair of bins j, r-j walks k with the root index j*k mod r.
@@ -306,33 +295,17 @@ ErrorCode TwReal(const Dft& dft, int32 r, f64* data, const f64* twc, const f64* 
   return e;
 }
 
-// ---- kind 0: codelet passes, one instance per radix ----------------------
+// ---- kind 0: the generated passes of each radix -------------------------
 
-template <int R, CxCodelet CX, RealCodelet RE>
-struct CodeletPasses {
-  static constexpr CodeletDft kDft{CX, RE};
-  static void CxNotw(const f64* ir, const f64* ii, f64* or_, f64* oi, ptrdiff_t is, ptrdiff_t os, int32 count) {
-    NotwCx(kDft, R, ir, ii, or_, oi, is, os, count);
-  }
-  static void RealNotw(const f64* in, f64* out, ptrdiff_t is, ptrdiff_t os, int32 count) {
-    NotwReal(kDft, R, in, out, is, os, count);
-  }
-  static void CxTw(f64* re, f64* im, const f64* twc, const f64* tws, ptrdiff_t stride, int32 m) {
-    f64 buf[2 * R];
-    TwCx(kDft, R, re, im, twc, tws, stride, m, buf);
-  }
-  static void RealTw(f64* data, const f64* twc, const f64* tws, ptrdiff_t stride, int32 m) {
-    f64 buf[4 * R];
-    TwReal(kDft, R, data, twc, tws, stride, m, buf);
-  }
-  static constexpr KwfftPasses kPasses{RealNotw, RealTw, CxNotw, CxTw};
-};
+#define TSM_KWFFT_PASSES(r) \
+  constexpr KwfftPasses kPasses##r{kwfft_real_notw_##r, kwfft_real_tw_##r, kwfft_cx_notw_##r, kwfft_cx_tw_##r};
+TSM_KWFFT_CODELET_RADICES(TSM_KWFFT_PASSES)
+#undef TSM_KWFFT_PASSES
 
 struct PassTable {
   const KwfftPasses* by_radix[kMaxCodeletRadix + 1] = {};
   constexpr PassTable() {
-#define TSM_KWFFT_PASS_ENTRY(r) \
-  by_radix[r] = &CodeletPasses<r, kwfft_cx_codelet_##r, kwfft_real_codelet_##r>::kPasses;
+#define TSM_KWFFT_PASS_ENTRY(r) by_radix[r] = &kPasses##r;
     TSM_KWFFT_CODELET_RADICES(TSM_KWFFT_PASS_ENTRY)
 #undef TSM_KWFFT_PASS_ENTRY
   }

@@ -2,6 +2,8 @@
 // over a root table (kind 1) and Rader's pass over a nested plan (kind 2).
 #include "transforms/kwfft_passes.h"
 
+#include <algorithm>
+
 #include "frame/workspace.h"
 #include "transforms/generated/kwfft_codelet_passes.h"
 #include "transforms/kwfft.h"
@@ -329,6 +331,55 @@ ErrorCode WithScratchDft(const kwfft_table& plan, int32 level, Fn fn) {
   return fn(RaderDft{r, stage, work.get()}, work.get() + 6 * r);
 }
 
+// When the distance of two blocks is a multiple of 4 KiB, the r values of one
+// position all fall into one set of a typical L1 cache, and a twiddle pass
+// walking the positions in place thrashes it. Such passes run over a few
+// positions at a time copied into a contiguous buffer; the arithmetic is the
+// same, so are the results.
+constexpr int32 kChunk = 16;
+constexpr ptrdiff_t kAliasBytes = 4096;
+
+bool BlocksAlias(int32 r, ptrdiff_t stride, int32 m) {
+  const ptrdiff_t distance = stride * m * static_cast<ptrdiff_t>(sizeof(f64));
+  return r >= 8 && m > kChunk && distance % kAliasBytes == 0;
+}
+
+// The pass over positions k0 .. k0+nb-1 through the buffer. A chunk after the
+// first has a dummy position 0 in front (the pass multiplies nothing there),
+// so that buffer position j meets twiddle row k0+j-2, the row of its
+// original position k0+j-1.
+void BufferedCxTw(CxTwPass pass, int32 r, f64* re, f64* im, const f64* twc, const f64* tws, ptrdiff_t stride,
+                  int32 m) {
+  f64 br[kMaxCodeletRadix * (kChunk + 1)];
+  f64 bi[kMaxCodeletRadix * (kChunk + 1)];
+  for (int32 k0 = 0; k0 < m; k0 += kChunk) {
+    const int32 nb = std::min(kChunk, m - k0);
+    const int32 front = k0 == 0 ? 0 : 1;
+    const int32 mb = nb + front;
+    for (int32 j = 0; j < r; ++j) {
+      const ptrdiff_t from = (static_cast<ptrdiff_t>(j) * m + k0) * stride;
+      f64* tr = br + j * mb;
+      f64* ti = bi + j * mb;
+      if (front) tr[0] = ti[0] = 0.0;
+      for (int32 q = 0; q < nb; ++q) {
+        tr[front + q] = re[from + q * stride];
+        ti[front + q] = im[from + q * stride];
+      }
+    }
+    const ptrdiff_t row = k0 == 0 ? 0 : static_cast<ptrdiff_t>(k0 - 1) * (r - 1);
+    pass(br, bi, twc + row, tws + row, 1, mb);
+    for (int32 j = 0; j < r; ++j) {
+      const ptrdiff_t to = (static_cast<ptrdiff_t>(j) * m + k0) * stride;
+      const f64* tr = br + j * mb + front;
+      const f64* ti = bi + j * mb + front;
+      for (int32 q = 0; q < nb; ++q) {
+        re[to + q * stride] = tr[q];
+        im[to + q * stride] = ti[q];
+      }
+    }
+  }
+}
+
 }  // namespace
 
 const KwfftPasses* KwfftPassesForRadix(int32 r) {
@@ -360,11 +411,14 @@ ErrorCode KwfftRealNotw(const kwfft_table& plan, int32 level, const f64* in, f64
 
 ErrorCode KwfftCxTw(const kwfft_table& plan, int32 level, f64* re, f64* im, ptrdiff_t stride, int32 m) {
   const kwfft_stage& st = *plan.stages[level];
+  const int32 r = plan.factors[level];
   if (plan.kinds[level] == kKindCodelet) {
-    plan.passes[level]->cx_tw(re, im, st.tw_cos, st.tw_sin, stride, m);
+    if (BlocksAlias(r, stride, m))
+      BufferedCxTw(plan.passes[level]->cx_tw, r, re, im, st.tw_cos, st.tw_sin, stride, m);
+    else
+      plan.passes[level]->cx_tw(re, im, st.tw_cos, st.tw_sin, stride, m);
     return TSM_SUCCESS;
   }
-  const int32 r = plan.factors[level];
   return WithScratchDft(plan, level, [&](const auto& dft, f64* buf) {
     return TwCx(dft, r, re, im, st.tw_cos, st.tw_sin, stride, m, buf);
   });

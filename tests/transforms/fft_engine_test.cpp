@@ -237,7 +237,8 @@ TEST(KwfftTransform, EveryLengthUpTo4096) {
 }
 
 TEST(KwfftTransform, LargeAndAwkwardLengths) {
-  for (int n : {44100, 48000, 65536, 65537, 1 << 20, 3 << 18, 4099, 10007, 23 * 47 * 53, 2 * 3 * 5 * 7 * 11 * 13 * 17})
+  for (int n : {8192, 32768, 44100, 48000, 65536, 65537, 1 << 20, 3 << 18, 4099, 10007, 23 * 47 * 53,
+                2 * 3 * 5 * 7 * 11 * 13 * 17})
     ExpectAccurate(n);
 }
 

@@ -85,7 +85,7 @@ TEST_F(FftEntries, ComplexForwardReadsZerosOutsideTheInput) {
   const std::vector<cx> xs = RandomCx(12, 2);
   struct Case {
     int offset, fftSize, shift;
-  } cases[] = {{0, 12, 0}, {0, 12, 1}, {4, 16, 0}, {-3, 10, 1}, {20, 5, 0}, {2, 7, 1}};
+  } cases[] = {{0, 12, 0}, {0, 12, 1}, {4, 16, 0}, {-3, 10, 1}, {20, 5, 0}, {2, 7, 1}, {0, 8192, 1}};
   for (const Case& c : cases) {
     Cx x(xs), X;
     PlanHolder* state = nullptr;

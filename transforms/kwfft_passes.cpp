@@ -380,6 +380,44 @@ void BufferedCxTw(CxTwPass pass, int32 r, f64* re, f64* im, const f64* twc, cons
   }
 }
 
+// The real twiddle pass through the buffer. Its positions pair up as k and
+// m-k, so a chunk holds pairs k0 .. k0+nb-1 as positions 1..nb and their
+// mirrors as mb-1 .. mb-nb of blocks of mb = 2nb+1 values; the first chunk
+// brings position 0 (the DC values), the last one for even m the middle
+// position (mb is then 2nb+2, its middle that of the original). Whether an
+// output goes to the first or the mirrored half depends on its block only,
+// so every value comes back to the position it was read from.
+void BufferedRealTw(RealTwPass pass, int32 r, f64* data, const f64* twc, const f64* tws, ptrdiff_t stride, int32 m) {
+  f64 buf[kMaxCodeletRadix * (2 * kChunk + 2)];
+  const int32 pairs = (m - 1) / 2;
+  for (int32 k0 = 1; k0 <= pairs; k0 += kChunk) {
+    const int32 nb = std::min(kChunk, pairs - k0 + 1);
+    const bool first = k0 == 1;
+    const bool middle = k0 + nb - 1 == pairs && m % 2 == 0;
+    const int32 mb = 2 * nb + 1 + (middle ? 1 : 0);
+    // (buffer position, original position) of every value of a block in the chunk
+    auto each = [&](auto move) {
+      for (int32 j = 0; j < r; ++j) {
+        f64* block = data + static_cast<ptrdiff_t>(j) * m * stride;
+        f64* b = buf + j * mb;
+        if (first) move(b[0], block[0]);
+        for (int32 q = 1; q <= nb; ++q) {
+          const ptrdiff_t k = k0 + q - 1;
+          move(b[q], block[k * stride]);
+          move(b[mb - q], block[(m - k) * stride]);
+        }
+        if (middle) move(b[mb / 2], block[static_cast<ptrdiff_t>(m / 2) * stride]);
+      }
+    };
+    if (!first)
+      for (int32 j = 0; j < r; ++j) buf[j * mb] = 0.0;
+    each([](f64& b, const f64& d) { b = d; });
+    const ptrdiff_t row = static_cast<ptrdiff_t>(k0 - 1) * (r - 1);
+    pass(buf, twc + row, tws + row, 1, mb);
+    each([](const f64& b, f64& d) { d = b; });
+  }
+}
+
 }  // namespace
 
 const KwfftPasses* KwfftPassesForRadix(int32 r) {
@@ -426,11 +464,14 @@ ErrorCode KwfftCxTw(const kwfft_table& plan, int32 level, f64* re, f64* im, ptrd
 
 ErrorCode KwfftRealTw(const kwfft_table& plan, int32 level, f64* data, ptrdiff_t stride, int32 m) {
   const kwfft_stage& st = *plan.stages[level];
+  const int32 r = plan.factors[level];
   if (plan.kinds[level] == kKindCodelet) {
-    plan.passes[level]->real_tw(data, st.tw_cos, st.tw_sin, stride, m);
+    if (BlocksAlias(r, stride, m))
+      BufferedRealTw(plan.passes[level]->real_tw, r, data, st.tw_cos, st.tw_sin, stride, m);
+    else
+      plan.passes[level]->real_tw(data, st.tw_cos, st.tw_sin, stride, m);
     return TSM_SUCCESS;
   }
-  const int32 r = plan.factors[level];
   return WithScratchDft(plan, level, [&](const auto& dft, f64* buf) {
     return TwReal(dft, r, data, st.tw_cos, st.tw_sin, stride, m, buf);
   });

@@ -278,21 +278,21 @@ TEST(KwfftHalfComplex, UnpackAndPackWithAndWithoutShift) {
     const std::vector<double> x = Uniform(n, 11);
     const std::vector<CxL> exact = ReferenceDft(ToCx(x, {}));
     for (int shift : {0, 1}) {
-      std::vector<tsm::cx> spec(n, tsm::cx{7.0, 7.0});
-      ASSERT_EQ(tsm::kwfft_real(plan.p, x.data(), &spec[0].re, 1, 2, n), 0);
-      tsm::kwfft_unpack_halfcomplex(spec.data(), n, shift);
+      std::vector<tsm::cx> spectrum(n, tsm::cx{7.0, 7.0});
+      ASSERT_EQ(tsm::kwfft_real(plan.p, x.data(), &spectrum[0].re, 1, 2, n), 0);
+      tsm::kwfft_unpack_halfcomplex(spectrum.data(), n, shift);
       for (int k = -(n - 1) / 2; k <= n / 2; ++k) {
         const int at = shift ? (n / 2 + k) % n : (k + n) % n;
         const CxL want = exact[(k + n) % n];
-        EXPECT_NEAR(spec[at].re, static_cast<double>(want.real()), 1e-14) << n << " " << shift << " bin " << k;
-        EXPECT_NEAR(spec[at].im, static_cast<double>(want.imag()), 1e-14) << n << " " << shift << " bin " << k;
+        EXPECT_NEAR(spectrum[at].re, static_cast<double>(want.real()), 1e-14) << n << " " << shift << " bin " << k;
+        EXPECT_NEAR(spectrum[at].im, static_cast<double>(want.imag()), 1e-14) << n << " " << shift << " bin " << k;
       }
-      EXPECT_EQ(spec[shift ? n / 2 : 0].im, 0.0);  // exactly 0, not rounding noise
+      EXPECT_EQ(spectrum[shift ? n / 2 : 0].im, 0.0);  // exactly 0, not rounding noise
       if (n % 2 == 0) {
-        EXPECT_EQ(spec[shift ? 0 : n / 2].im, 0.0);
+        EXPECT_EQ(spectrum[shift ? 0 : n / 2].im, 0.0);
       }
       std::vector<double> hc(n, -1.0), direct(n);
-      tsm::kwfft_pack_halfcomplex(spec.data(), n, shift, hc.data());
+      tsm::kwfft_pack_halfcomplex(spectrum.data(), n, shift, hc.data());
       ASSERT_EQ(tsm::kwfft_real(plan.p, x.data(), direct.data(), 1, 1, n), 0);
       EXPECT_EQ(hc, direct) << n << " " << shift;
     }

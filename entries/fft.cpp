@@ -114,8 +114,7 @@ int32 InvCxFft80(CxArrayHdl X, CxArrayHdl x, const State& state, int32 shift) {
 // The HalfComplex entries empty their float64 output with the complex type
 // code, as they always have.
 ErrorCode FailHalfComplex(ErrorCode code, F64ArrayHdl& out) {
-  HostNumericArrayResize(TSM_TYPE_CX128, 1, &out, 0);
-  SetDim(out, 0, 0);
+  EmptyOutput(out, TSM_TYPE_CX128);
   return code;
 }
 

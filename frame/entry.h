@@ -41,10 +41,11 @@ int32 ResizeOutput(Block**& h, int32 rows, int32 cols) {
 }
 
 // Shrinks an output to 0 elements and writes 0 to its dimension fields; the
-// host's result is ignored: the fields are written in any case.
+// host's result is ignored: the fields are written in any case. A few entries
+// shrink with another type code than their block's, hence the override.
 template <class Block>
-void EmptyOutput(Block**& h) {
-  HostNumericArrayResize(BlockTraits<Block>::kTypeCode, BlockTraits<Block>::kDims, &h, 0);
+void EmptyOutput(Block**& h, int32 typeCode = BlockTraits<Block>::kTypeCode) {
+  HostNumericArrayResize(typeCode, BlockTraits<Block>::kDims, &h, 0);
   if (h != nullptr && *h != nullptr)
     for (int d = 0; d < BlockTraits<Block>::kDims; ++d) SetDim(h, d, 0);
 }

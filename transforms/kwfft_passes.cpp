@@ -102,8 +102,9 @@ struct GenericDft {
 // Rader's DFT of prime length p over the nested plan of p-1: the inputs
 // other than x[0], gathered by powers of the primitive root, are cyclically
 // convolved with the prepared sequence through two forward transforms (the
-// conjugation between them makes the second one an inverse). work holds 6p
-// values.
+// conjugation between them makes the second one an inverse). Bin 0 of the
+// first transform is the sum of the gathered inputs, so y[0] costs one add
+// rather than a serial chain over p values. work holds 6p values.
 struct RaderDft {
   int32 p;
   const kwfft_stage* stage;
@@ -116,18 +117,16 @@ struct RaderDft {
     f64* ur = work;
     f64* ui = work + n1;
     const f64 x0r = ir[0], x0i = ii[0];
-    f64 sr = x0r, si = x0i;
     for (int32 i = 0; i < n1; ++i) {
       const ptrdiff_t at = gather[i + 1] * is;
       ur[i] = ir[at];
       ui[i] = ii[at];
-      sr += ur[i];
-      si += ui[i];
     }
     f64* yr = or_ + os;
     f64* yi = oi + os;
     ErrorCode e = kwfft_complex(stage->rader_plan, ur, ui, yr, yi, 1, os, n1);
     if (e != TSM_SUCCESS) return e;
+    const f64 sr = x0r + yr[0], si = x0i + yi[0];
     for (int32 i = 0; i < n1; ++i) {
       const f64 a = yr[i * os], b = yi[i * os], c = stage->rader_cos[i], t = stage->rader_sin[i];
       yr[i * os] = a * c - b * t;
@@ -155,13 +154,10 @@ struct RaderDft {
     f64* ur = work + 4 * n1;
     f64* ui = work + 5 * n1;
     const f64 x0 = in[0];
-    f64 sum = x0;
-    for (int32 i = 0; i < n1; ++i) {
-      g[i] = in[gather[i + 1] * is];
-      sum += g[i];
-    }
+    for (int32 i = 0; i < n1; ++i) g[i] = in[gather[i + 1] * is];
     ErrorCode e = kwfft_real(stage->rader_plan, g, hc, 1, 1, n1);
     if (e != TSM_SUCCESS) return e;
+    const f64 sum = x0 + hc[0];
     fr[0] = hc[0];
     fi[0] = 0;
     for (int32 k = 1; k < n1 - k; ++k) {

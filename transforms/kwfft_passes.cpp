@@ -158,20 +158,20 @@ struct RaderDft {
     ErrorCode e = kwfft_real(stage->rader_plan, g, hc, 1, 1, n1);
     if (e != TSM_SUCCESS) return e;
     const f64 sum = x0 + hc[0];
-    fr[0] = hc[0];
-    fi[0] = 0;
+    // Bins k and n1-k of the Hermitian spectrum are (a, b) and (a, -b): expand
+    // and multiply by the prepared spectrum (conjugating) in one sweep.
+    const f64* wc = stage->rader_cos;
+    const f64* ws = stage->rader_sin;
+    auto put = [&](int32 i, f64 a, f64 b) {
+      fr[i] = a * wc[i] - b * ws[i];
+      fi[i] = -(a * ws[i] + b * wc[i]);
+    };
+    put(0, hc[0], 0.0);
     for (int32 k = 1; k < n1 - k; ++k) {
-      fr[k] = fr[n1 - k] = hc[k];
-      fi[k] = hc[n1 - k];
-      fi[n1 - k] = -hc[n1 - k];
+      put(k, hc[k], hc[n1 - k]);
+      put(n1 - k, hc[k], -hc[n1 - k]);
     }
-    fr[n1 / 2] = hc[n1 / 2];
-    fi[n1 / 2] = 0;
-    for (int32 i = 0; i < n1; ++i) {
-      const f64 a = fr[i], b = fi[i], c = stage->rader_cos[i], t = stage->rader_sin[i];
-      fr[i] = a * c - b * t;
-      fi[i] = -(a * t + b * c);
-    }
+    put(n1 / 2, hc[n1 / 2], 0.0);
     e = kwfft_complex(stage->rader_plan, fr, fi, ur, ui, 1, 1, n1);
     if (e != TSM_SUCCESS) return e;
     out[0] = sum;

@@ -27,11 +27,6 @@ struct ColsSlot {
   ErrorCode Ensure(int32 length, kwfft_table** plan) const { return state.Ensure(length, plan, 1); }
 };
 
-template <class Block>
-int32 Report(ErrorCode e, Block**& out) {
-  return e < 0 ? FailB(e, out) : e;
-}
-
 // size below 1 takes the input's count; the inverses pass 0.
 template <class State>
 int32 Frame1D(TrigKind kind, F64ArrayHdl x, F64ArrayHdl y, int32 size, const State& state) {
@@ -41,7 +36,7 @@ int32 Frame1D(TrigKind kind, F64ArrayHdl x, F64ArrayHdl y, int32 size, const Sta
   if (ResizeOutput(y, n) != 0) return FailB(TSM_ERR_NO_MEMORY, y);
   kwfft_table* plan = nullptr;
   if (const ErrorCode e = EnsureTrigPlan(state, kind, n, &plan); e != TSM_SUCCESS) return FailB(e, y);
-  return Report(TrigTransform(kind, plan, Elems(x), std::min(count, n), Elems(y), n), y);
+  return ReportB(TrigTransform(kind, plan, Elems(x), std::min(count, n), Elems(y), n), y);
 }
 
 template <class RowsState, class ColsState>
@@ -53,10 +48,14 @@ int32 Frame2D(TrigKind kind, MatrixHdl x, MatrixHdl y, int32 rows, int32 cols, c
   if (cols < 1) cols = xCols;
   kwfft_table *planRows = nullptr, *planCols = nullptr;
   if (const ErrorCode e = EnsureTrigPlan(stateRows, kind, rows, &planRows); e != TSM_SUCCESS) return FailB(e, y);
+  // A reference of the call's own keeps the rows plan alive should both state
+  // arguments name one holder, which the cols plan then replaces.
+  const KwfftTableReference keepRows(CreateKwfftTable(planRows->n));
+  if (keepRows == nullptr) return FailB(TSM_ERR_NO_MEMORY, y);
   if (const ErrorCode e = EnsureTrigPlan(stateCols, kind, cols, &planCols); e != TSM_SUCCESS) return FailB(e, y);
   if (static_cast<std::int64_t>(rows) * cols > INT32_MAX || ResizeOutput(y, rows, cols) != 0)
     return FailB(TSM_ERR_NO_MEMORY, y);
-  return Report(TrigTransform2D(kind, planRows, planCols, Elems(x), xRows, xCols, Elems(y), rows, cols), y);
+  return ReportB(TrigTransform2D(kind, keepRows.get(), planCols, Elems(x), xRows, xCols, Elems(y), rows, cols), y);
 }
 
 int32 Plain2D(TrigKind kind, MatrixHdl x, MatrixHdl y, int32 rows, int32 cols, PlanHolder** stateRows,

@@ -9,13 +9,6 @@ using namespace tsm;
 
 namespace {
 
-// A negative kernel code empties the output; zero or a warning is returned
-// as it is.
-template <class Block>
-int32 Report(ErrorCode e, Block**& out) {
-  return e < 0 ? FailB(e, out) : e;
-}
-
 template <class State>
 ErrorCode KeepPlan(const State& state, int32 n) {
   kwfft_table* plan = nullptr;
@@ -28,7 +21,7 @@ int32 InPlace(ErrorCode (*kernel)(f64*, int32), F64ArrayHdl x, const State& stat
   const int32 n = Count(x);
   if (n < 1) return FailB(TSM_ERR_EMPTY, x);
   if (const ErrorCode e = KeepPlan(state, n); e != TSM_SUCCESS) return FailB(e, x);
-  return Report(kernel(Elems(x), n), x);
+  return ReportB(kernel(Elems(x), n), x);
 }
 
 template <class State>
@@ -37,7 +30,7 @@ int32 CxSpectrum(CxArrayHdl x, F64ArrayHdl s, const State& state) {
   if (n < 1) return FailB(TSM_ERR_EMPTY, s);
   if (ResizeOutput(s, n) != 0) return FailB(TSM_ERR_NO_MEMORY, s);
   if (const ErrorCode e = KeepPlan(state, n); e != TSM_SUCCESS) return FailB(e, s);
-  return Report(CxPowerSpectrum(Elems(x), n, Elems(s)), s);
+  return ReportB(CxPowerSpectrum(Elems(x), n, Elems(s)), s);
 }
 
 template <class Block, class State>
@@ -48,7 +41,7 @@ int32 Cross(ErrorCode (*kernel)(const ElemOf<Block>*, const ElemOf<Block>*, int3
   if (Count(y) != n) return FailB(TSM_ERR_SIZE_MISMATCH, S);
   if (ResizeOutput(S, n) != 0) return FailB(TSM_ERR_NO_MEMORY, S);
   if (const ErrorCode e = KeepPlan(state, n); e != TSM_SUCCESS) return FailB(e, S);
-  return Report(kernel(Elems(x), Elems(y), n, Elems(S)), S);
+  return ReportB(kernel(Elems(x), Elems(y), n, Elems(S)), S);
 }
 
 }  // namespace

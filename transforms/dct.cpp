@@ -1,6 +1,7 @@
 #include "transforms/dct.h"
 
 #include <algorithm>
+#include <climits>
 #include <cmath>
 #include <cstddef>
 
@@ -164,6 +165,7 @@ ErrorCode PrepareLines(HeapScratch<f64>& block, Line* lines, int count) {
   std::int64_t tables = 0, work = 0;
   for (int i = 0; i < count; ++i) {
     if (lines[i].n < 1) return IsCosine(lines[i].kind) ? TSM_ERR_EMPTY : TSM_ERR_TRANSFORM_SIZE;
+    if (TrigPlanLength(lines[i].kind, lines[i].n) > INT32_MAX) return TSM_ERR_NO_MEMORY;
     tables += TableValues(lines[i].kind, lines[i].n);
     work = std::max(work, WorkValues(lines[i].kind, lines[i].n));
   }

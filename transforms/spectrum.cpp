@@ -10,20 +10,16 @@ namespace {
 // what every kernel here starts from, released on every path.
 class PlanAndScratch {
  public:
-  PlanAndScratch() = default;
-  PlanAndScratch(const PlanAndScratch&) = delete;
-  PlanAndScratch& operator=(const PlanAndScratch&) = delete;
-  ~PlanAndScratch() { DestroyKwfftTable(plan_); }
   ErrorCode Take(int32 n, std::int64_t values) {
-    plan_ = CreateKwfftTable(n);
+    plan_.reset(CreateKwfftTable(n));
     if (plan_ == nullptr || (values > 0 && !scratch_.Allocate(values))) return TSM_ERR_NO_MEMORY;
     return TSM_SUCCESS;
   }
-  const kwfft_table* plan() const { return plan_; }
+  const kwfft_table* plan() const { return plan_.get(); }
   f64* scratch() const { return scratch_.get(); }
 
  private:
-  kwfft_table* plan_ = nullptr;
+  KwfftTableReference plan_;
   HeapScratch<f64> scratch_;
 };
 

@@ -209,6 +209,16 @@ TEST_F(DctEntries, TwoDimensionsMatchGoldenAndInvertIt) {
   }
 }
 
+TEST_F(DctEntries, OneStateForBothDimensionsStillTransforms) {
+  const V x = RandomReal(12, 4);
+  for (const Kind& k : kForward) {
+    States shared, s;
+    HostMatrix in(3, 4, x), y(0, 0, {});
+    ASSERT_EQ(k.plain2(in.Handle(), y.Handle(), 0, 0, &shared.plain, &shared.plain), 0) << k.name;
+    EXPECT_EQ(y.Values(), Run2(k, x, 3, 4, 0, 0)) << k.name;
+  }
+}
+
 TEST_F(DctEntries, AnEmptyInputGivesEmptyAndAnEmptyOutput) {
   for (const Kind* set : {kForward, kInverse})
     for (int i = 0; i < 2; ++i) {

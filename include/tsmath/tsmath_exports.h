@@ -1,6 +1,6 @@
 /* Automatically generated from entries/exports.table, do not edit.
  * Regenerate: cmake -P tools/gen_exports.cmake
- * 36 exports. Included by tsmath.h inside its extern "C" block. */
+ * 68 exports. Included by tsmath.h inside its extern "C" block. */
 #ifndef TSMATH_EXPORTS_H
 #define TSMATH_EXPORTS_H
 
@@ -47,5 +47,41 @@ TSM_API int32_t ReKWFFTH(F64ArrayHdl x, CxArrayHdl X, PlanHolder** state);
 TSM_API int32_t CxKWFFTH(CxArrayHdl x, CxArrayHdl X, PlanHolder** state);
 TSM_API int32_t InvReKWFFTH(CxArrayHdl X, F64ArrayHdl x, PlanHolder** state);
 TSM_API int32_t InvCxKWFFTH(CxArrayHdl X, CxArrayHdl x, PlanHolder** state);
+
+/* Spectra and Hilbert */
+TSM_API int32_t SpectrumH(F64ArrayHdl x, PlanHolder** state);
+TSM_API int32_t SpectrumH_IDP(F64ArrayHdl x, ReservedTransformState** state);
+TSM_API int32_t CxSpectrumH(CxArrayHdl x, F64ArrayHdl s, PlanHolder** state);
+TSM_API int32_t CxSpectrumH_IDP(CxArrayHdl x, F64ArrayHdl s, ReservedTransformState** state);
+TSM_API int32_t CrossSpectrumH(F64ArrayHdl x, F64ArrayHdl y, CxArrayHdl S, PlanHolder** state);
+TSM_API int32_t CrossSpectrumH_IDP(F64ArrayHdl x, F64ArrayHdl y, CxArrayHdl S, ReservedTransformState** state);
+TSM_API int32_t CxCrossSpectrumH(CxArrayHdl x, CxArrayHdl y, CxArrayHdl S, PlanHolder** state);
+TSM_API int32_t CxCrossSpectrumH_IDP(CxArrayHdl x, CxArrayHdl y, CxArrayHdl S, ReservedTransformState** state);
+TSM_API int32_t FastHilbertTransformH(F64ArrayHdl x, PlanHolder** state);
+TSM_API int32_t FastHilbertTransformH_IDP(F64ArrayHdl x, ReservedTransformState** state);
+TSM_API int32_t InvFastHilbertTransformH(F64ArrayHdl x, PlanHolder** state);
+TSM_API int32_t InvFastHilbertTransformH_IDP(F64ArrayHdl x, ReservedTransformState** state);
+TSM_API int32_t FHTH(F64ArrayHdl x, PlanHolder** state);
+TSM_API int32_t FHTH_IDP(F64ArrayHdl x, ReservedTransformState** state);
+TSM_API int32_t InvFHTH(F64ArrayHdl x, PlanHolder** state);
+TSM_API int32_t InvFHTH_IDP(F64ArrayHdl x, ReservedTransformState** state);
+
+/* DCT and DST */
+TSM_API int32_t DCT_1DH(F64ArrayHdl x, F64ArrayHdl y, int32_t size, PlanHolder** state);
+TSM_API int32_t DCT_1DH_IDP(F64ArrayHdl x, F64ArrayHdl y, int32_t size, ReservedTransformState** state);
+TSM_API int32_t DST_1DH(F64ArrayHdl x, F64ArrayHdl y, int32_t size, PlanHolder** state);
+TSM_API int32_t DST_1DH_IDP(F64ArrayHdl x, F64ArrayHdl y, int32_t size, ReservedTransformState** state);
+TSM_API int32_t InvDCT_1DH(F64ArrayHdl y, F64ArrayHdl x, PlanHolder** state);
+TSM_API int32_t InvDCT_1DH_IDP(F64ArrayHdl y, F64ArrayHdl x, ReservedTransformState** state);
+TSM_API int32_t InvDST_1DH(F64ArrayHdl y, F64ArrayHdl x, PlanHolder** state);
+TSM_API int32_t InvDST_1DH_IDP(F64ArrayHdl y, F64ArrayHdl x, ReservedTransformState** state);
+TSM_API int32_t DCT_2DH(MatrixHdl x, MatrixHdl y, int32_t rows, int32_t cols, PlanHolder** stateRows, PlanHolder** stateCols);
+TSM_API int32_t DCT_2DH_IDP(MatrixHdl x, MatrixHdl y, int32_t rows, int32_t cols, ReservedTransformState** state);
+TSM_API int32_t DST_2DH(MatrixHdl x, MatrixHdl y, int32_t rows, int32_t cols, PlanHolder** stateRows, PlanHolder** stateCols);
+TSM_API int32_t DST_2DH_IDP(MatrixHdl x, MatrixHdl y, int32_t rows, int32_t cols, ReservedTransformState** state);
+TSM_API int32_t InvDCT_2DH(MatrixHdl y, MatrixHdl x, PlanHolder** stateRows, PlanHolder** stateCols);
+TSM_API int32_t InvDCT_2DH_IDP(MatrixHdl y, MatrixHdl x, ReservedTransformState** state);
+TSM_API int32_t InvDST_2DH(MatrixHdl y, MatrixHdl x, PlanHolder** stateRows, PlanHolder** stateCols);
+TSM_API int32_t InvDST_2DH_IDP(MatrixHdl y, MatrixHdl x, ReservedTransformState** state);
 
 #endif

@@ -20,6 +20,8 @@ using V = std::vector<double>;
 using LD = long double;
 constexpr double kNan = std::numeric_limits<double>::quiet_NaN();
 constexpr LD kPiL = std::numbers::pi_v<LD>;
+// Every resize moves the block: an entry that kept a pointer across one fails.
+const bool gMoving = (tsrt_always_move(1), true);
 
 struct Out {
   int32_t ret, err;

@@ -55,7 +55,8 @@ int32 SampleB(F64ArrayHdl xy, int32 n, f64 delay, f64 dt, ErrorCode check, Kerne
   return code < 0 ? FailB(code, xy) : code;
 }
 
-bool OnGrid(F64ArrayHdl xy, int32 n) { return Count(xy) < 1 && n < 1; }
+// No times given and no samples asked for.
+bool NoSamples(F64ArrayHdl xy, int32 n) { return Count(xy) < 1 && n < 1; }
 
 }  // namespace
 
@@ -150,7 +151,7 @@ int32_t RampPtrn80(F64ArrayHdl out, int32_t n, double start, double end, int32_t
 
 int32_t AperiodTriangleH(F64ArrayHdl xy, int32_t n, double amp, double delay, double dt, double width,
                          double skew) {
-  const ErrorCode check = FirstFailure({{OnGrid(xy, n), TSM_ERR_EMPTY},
+  const ErrorCode check = FirstFailure({{NoSamples(xy, n), TSM_ERR_EMPTY},
                                         {!(width > 0), TSM_ERR_NOT_POSITIVE},
                                         {!(dt > 0), TSM_ERR_STEP_NOT_POSITIVE},
                                         {!(skew >= 0 && skew <= 1), TSM_ERR_PROBABILITY_RANGE}});
@@ -161,7 +162,7 @@ int32_t AperiodTriangleH(F64ArrayHdl xy, int32_t n, double amp, double delay, do
 
 int32_t GaussMonopulseH(F64ArrayHdl xy, int32_t n, double dt, double delay, double fc, double amp) {
   const ErrorCode check = FirstFailure({{!(fc > 0), TSM_ERR_NOT_POSITIVE},
-                                        {OnGrid(xy, n), TSM_ERR_EMPTY},
+                                        {NoSamples(xy, n), TSM_ERR_EMPTY},
                                         {!(dt > 0), TSM_ERR_STEP_NOT_POSITIVE}});
   return SampleB(xy, n, delay, dt, check,
                  [&](f64* y, int32 m, const SampleTimes& at) { return GaussMonopulse(y, m, at, fc, amp); });
@@ -170,7 +171,7 @@ int32_t GaussMonopulseH(F64ArrayHdl xy, int32_t n, double dt, double delay, doub
 int32_t GaussPulseH(F64ArrayHdl xy, int32_t n, double amp, double delay, double dt, double fc, double bw,
                     double att) {
   const ErrorCode check = FirstFailure({{!(fc > 0 && bw > 0 && att > 0), TSM_ERR_NOT_POSITIVE},
-                                        {OnGrid(xy, n), TSM_ERR_EMPTY},
+                                        {NoSamples(xy, n), TSM_ERR_EMPTY},
                                         {!(dt > 0), TSM_ERR_STEP_NOT_POSITIVE}});
   return SampleB(xy, n, delay, dt, check,
                  [&](f64* y, int32 m, const SampleTimes& at) { return GaussPulse(y, m, at, amp, fc, bw, att); });
@@ -178,7 +179,7 @@ int32_t GaussPulseH(F64ArrayHdl xy, int32_t n, double amp, double delay, double 
 
 int32_t PeriodicSincH(F64ArrayHdl xy, int32_t n, double amp, int32_t order, double dt, double delay) {
   const ErrorCode check = FirstFailure({{order < 1, TSM_ERR_NOT_POSITIVE},
-                                        {OnGrid(xy, n), TSM_ERR_EMPTY},
+                                        {NoSamples(xy, n), TSM_ERR_EMPTY},
                                         {!(dt > 0), TSM_ERR_STEP_NOT_POSITIVE}});
   return SampleB(xy, n, delay, dt, check,
                  [&](f64* y, int32 m, const SampleTimes& at) { return PeriodicSinc(y, m, at, amp, order); });

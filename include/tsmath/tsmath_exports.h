@@ -1,6 +1,7 @@
 /* Automatically generated from entries/exports.table, do not edit.
  * Regenerate: cmake -P tools/gen_exports.cmake
  * 68 exports. Included by tsmath.h inside its extern "C" block. */
+ * 54 exports. Included by tsmath.h inside its extern "C" block. */
 #ifndef TSMATH_EXPORTS_H
 #define TSMATH_EXPORTS_H
 
@@ -15,6 +16,26 @@ TSM_API void SetTSRTModule(void* module);
 TSM_API void SetTSRTTLSIndex(int32_t index);
 TSM_API void SetTSRTModuleHook(void* module);
 TSM_API void SetTSRTTLSIndexHook(int32_t index);
+
+/* Waveform generators */
+TSM_API int32_t SineWaveCIN(F64ArrayHdl out, int32_t* n, double* amp, double* freq, double* phase, int32_t* err);
+TSM_API int32_t SquareWaveCIN(F64ArrayHdl out, int32_t* n, double* amp, double* freq, double* phase, double* duty, int32_t* err);
+TSM_API int32_t SawtoothWaveCIN(F64ArrayHdl out, int32_t* n, double* amp, double* freq, double* phase, int32_t* err);
+TSM_API int32_t TriangleWaveCIN(F64ArrayHdl out, int32_t* n, double* amp, double* freq, double* phase, int32_t* err);
+TSM_API int32_t ArbitraryWaveCIN(F64ArrayHdl out, int32_t* n, double* amp, double* freq, double* phase, F64ArrayHdl table, int32_t* interp, int32_t* err);
+TSM_API int32_t ChirpCIN(F64ArrayHdl out, int32_t* n, double* amp, double* f1, double* f2, int32_t* err);
+TSM_API int32_t SinePtrn(F64ArrayHdl out, int32_t* n, double* amp, double* phase, double* cycles, int32_t* err);
+TSM_API int32_t Square(F64ArrayHdl out, int32_t* n, double* amp, double* duty, double* cycles, int32_t* err);
+TSM_API int32_t RampPtrn(F64ArrayHdl out, int32_t* n, double* start, double* end, int32_t* err);
+TSM_API int32_t ImpulsePtrn(F64ArrayHdl out, int32_t* n, double* amp, int32_t* delay, int32_t* err);
+TSM_API int32_t PulsePtrn(F64ArrayHdl out, int32_t* n, double* amp, int32_t* delay, int32_t* width, int32_t* err);
+TSM_API int32_t SincWave(F64ArrayHdl out, int32_t* n, double* amp, double* delay, double* dt, int32_t* err);
+TSM_API int32_t RampPtrn85(F64ArrayHdl out, int32_t n, double start, double end, int32_t mode, uint32_t scale);
+TSM_API int32_t RampPtrn80(F64ArrayHdl out, int32_t n, double start, double end, int32_t mode);
+TSM_API int32_t AperiodTriangleH(F64ArrayHdl xy, int32_t n, double amp, double delay, double dt, double width, double skew);
+TSM_API int32_t GaussMonopulseH(F64ArrayHdl xy, int32_t n, double dt, double delay, double fc, double amp);
+TSM_API int32_t GaussPulseH(F64ArrayHdl xy, int32_t n, double amp, double delay, double dt, double fc, double bw, double att);
+TSM_API int32_t PeriodicSincH(F64ArrayHdl xy, int32_t n, double amp, int32_t order, double dt, double delay);
 
 /* Descriptive statistics */
 TSM_API int32_t Mean_head(F64ArrayHdl x, double* mean, int32_t* err);

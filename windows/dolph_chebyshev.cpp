@@ -1,7 +1,8 @@
 // Dolph-Chebyshev window of N points (N = n symmetric, n+1 periodic).
 //
 // Frequency samples W(k) = T_{N-1}(b cos(pi k / N)), b = cosh(acosh(ratio) /
-// (N-1)), so W(0) = ratio. The window centred on (N-1)/2 is
+// (N-1)), so W(0) = ratio; only k below N/2 are formed, where the argument
+// is positive. The window centred on (N-1)/2 is
 //   w(j) = sum_k W(k) exp(-2 pi i k (j - (N-1)/2) / N),
 // real because W(N-k) = (-1)^(N-1) W(k). Its half from the centre on,
 // w(m) for offset m (m - 1/2 for even N), is N times the inverse DFT of
@@ -20,12 +21,18 @@ namespace {
 
 constexpr f64 kPi = 3.141592653589793;
 
-// T_degree(v): cos(degree acos v) inside [-1, 1], cosh(degree acosh |v|)
-// outside, negated for odd degree and negative v.
-f64 ChebyshevPolynomial(int32 degree, f64 v) {
-  if (std::fabs(v) <= 1.0) return std::cos(degree * std::acos(v));
-  const f64 t = std::cosh(degree * std::acosh(std::fabs(v)));
-  return (v < 0.0 && degree % 2 != 0) ? -t : t;
+// T_degree(v) at v = b cos(theta) > 0, with b - 1 given: cos(degree acos v)
+// up to 1, cosh(degree acosh v) beyond. Near v = 1 both inverse functions are
+// ill-conditioned in v, so they are taken from v - 1, formed without
+// cancellation as (b-1) cos(theta) - 2 sin^2(theta/2).
+f64 ChebyshevSample(int32 degree, f64 b_minus_1, f64 theta) {
+  const f64 s = std::sin(0.5 * theta);
+  const f64 v_minus_1 = b_minus_1 * std::cos(theta) - 2.0 * s * s;
+  if (v_minus_1 > 0.0)
+    return std::cosh(degree * std::log1p(v_minus_1 + std::sqrt(v_minus_1 * (v_minus_1 + 2.0))));
+  const f64 v = 1.0 + v_minus_1;
+  const f64 angle = v > 0.5 ? 2.0 * std::asin(std::sqrt(-0.5 * v_minus_1)) : std::acos(v);
+  return std::cos(degree * angle);
 }
 
 // The N-point window into w (N values); hc and out are N values of work.
@@ -33,12 +40,13 @@ ErrorCode MakeDolphChebyshev(int32 N, f64 ratio, f64* hc, f64* out, f64* w) {
   kwfft_table* plan = CreateKwfftTable(N);
   if (plan == nullptr) return TSM_ERR_NO_MEMORY;
   const int32 half = (N + 1) / 2;
-  const f64 b = std::cosh(std::acosh(ratio) / (N - 1));
+  const f64 sh = std::sinh(0.5 * std::acosh(ratio) / (N - 1));
+  const f64 b_minus_1 = 2.0 * sh * sh;  // cosh(a) - 1
   const bool even = N % 2 == 0;
   for (int32 k = 0; k < N; ++k) hc[k] = 0.0;  // W(N/2) = 0 for even N
   hc[0] = ratio;
   for (int32 k = 1; k < half; ++k) {
-    const f64 W = ChebyshevPolynomial(N - 1, b * std::cos(kPi * k / N));
+    const f64 W = ChebyshevSample(N - 1, b_minus_1, kPi * k / N);
     if (even) {
       hc[k] = W * std::cos(kPi * k / N);
       hc[N - k] = -W * std::sin(kPi * k / N);

@@ -141,6 +141,24 @@ int32_t ApplyCase(H h, const Case& c) {
   if constexpr (kCx) return CxSymmWinH(h, c.sel, c.param); else return SymmWinH(h, c.sel, c.param);
 }
 
+// Form A entries and the symmetric forms of the parametric entries.
+std::function<int32_t(F64ArrayHdl)> OtherEntry(const Case& c) {
+  const auto a = [](std::function<int32_t(F64ArrayHdl, int32_t*)> f) {
+    return [f](F64ArrayHdl x) {
+      int32_t err = 1;
+      return f(x, &err) + err;
+    };
+  };
+  double p = c.param;
+  if (c.kind == "per" && c.sel == 30) return a(TriangleWin);
+  if (c.kind == "per" && c.sel == 60) return a([p](F64ArrayHdl x, int32_t* e) mutable { return Kaiser_Bessel(x, &p, e); });
+  if (c.kind == "exp") return a([p](F64ArrayHdl x, int32_t* e) mutable { return ExpWindCIN(x, &p, e); });
+  if (c.kind == "taper" && c.param == 0.2) return a(CosTapered);
+  if (c.kind == "sym" && c.sel == 61) return [p](F64ArrayHdl x) { return DolChebyWinH(x, p, 1); };
+  if (c.kind == "sym" && c.sel == 62) return [p](F64ArrayHdl x) { return GaussWinH(x, p, -3); };
+  return {};
+}
+
 std::vector<cx> Noise(int n, unsigned seed) {
   std::mt19937 rng(seed);
   std::uniform_real_distribution<double> u(-2, 2);
@@ -164,6 +182,12 @@ void CheckWindows() {
     const V w = ones.Values();
     ASSERT_EQ(static_cast<int>(w.size()), c.n);
     for (int i = 0; i < c.n; ++i) ASSERT_NEAR(w[i], c.w[i], Tolerance(c, i)) << Name(c) << " i " << i;
+    // The same window through the other entries that make it.
+    if (const auto other = OtherEntry(c)) {
+      F64 y(V(c.n, 1.0));
+      ASSERT_EQ(other(y.Handle()), 0) << Name(c);
+      for (int i = 0; i < c.n; ++i) ASSERT_NEAR(y.At(i), c.w[i], Tolerance(c, i)) << Name(c) << " other, i " << i;
+    }
 
     // The complex twin scales both parts by exactly the real window.
     const std::vector<cx> z = Noise(c.n, c.n);

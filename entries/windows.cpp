@@ -49,12 +49,13 @@ int32 ScaledWin(Block** x, int32 selector, f64 param, WinConsts* consts) {
 
 }  // namespace
 
-#define TSM_WINDOW_PAIR(Name, CxName, Kernel)                                                   \
-  int32_t Name(F64ArrayHdl x) {                                                                 \
-    return WindowB(x, [](auto* v, int32 n) { return Kernel(v, n); });                            \
-  }                                                                                             \
-  int32_t CxName(CxArrayHdl x) {                                                                \
-    return WindowB(x, [](auto* v, int32 n) { return Kernel(v, n); });                             \
+// The parameterless windows, real and complex.
+#define TSM_WINDOW_PAIR(Name, CxName, Kernel)                                      \
+  int32_t Name(F64ArrayHdl x) {                                                    \
+    return WindowB(x, [](auto* v, int32 n) { return Kernel(v, n); });              \
+  }                                                                                \
+  int32_t CxName(CxArrayHdl x) {                                                   \
+    return WindowB(x, [](auto* v, int32 n) { return Kernel(v, n); });              \
   }
 
 extern "C" {
@@ -75,6 +76,7 @@ TSM_WINDOW_PAIR(BohmanWinH, CxBohmanWinH, BohmanWindow)
 TSM_WINDOW_PAIR(ParzenWinH, CxParzenWinH, ParzenWindow)
 TSM_WINDOW_PAIR(WelchWinH, CxWelchWinH, WelchWindow)
 TSM_WINDOW_PAIR(TriangleWinH, CxTriangleWinH, TriangleWindow)
+#undef TSM_WINDOW_PAIR
 
 int32_t TriangleWin(F64ArrayHdl x, int32_t* err) {
   return WindowA(x, err, [](auto* v, int32 n) { return TriangleWindow(v, n); });

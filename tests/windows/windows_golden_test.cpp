@@ -29,6 +29,7 @@
 #include <vector>
 
 #include "support/host_arrays.h"
+#include "windows/window_coefficients.h"
 
 namespace tsmtest {
 namespace {
@@ -75,28 +76,13 @@ const std::vector<Case>& Golden() {
   return cases;
 }
 
-const std::map<int, V> kCoefs = {
-    {0, {1.0}},
-    {1, {0.5, 0.5}},
-    {2, {0.54, 0.46}},
-    {3, {0.42323, 0.49755, 0.07922}},
-    {4, {0.4265907136715391, 0.4965606190885641, 0.07684866723989682}},
-    {5, {0.42, 0.5, 0.08}},
-    {6, {0.215578948, 0.41663158, 0.277263158, 0.083578947, 0.006947368}},
-    {7, {0.35875, 0.48829, 0.14128, 0.01168}},
-    {8, {0.27105140069342415, 0.43329793923448606, 0.21812299954311062, 0.0659254463880309, 0.010811742098372268,
-         0.0007765848252250934, 1.3887217350903198e-05}},
-    {9, {0.323215218, 0.471492057, 0.17553428, 0.028497078, 0.001261367}},
-    {11, {0.3635819, 0.4891775, 0.1365995, 0.0106411}},
-};
-
 double Tolerance(const Case& c, int i) {
   const int n = c.n;
   if (c.kind == "exp") return kEps * (i + 4) * (std::fabs(std::log(c.param)) + 1) * std::fabs(c.w[i]);
   if (c.kind == "taper") return 8 * kEps;
-  if (kCoefs.count(c.sel)) {
+  if (kCosineCoefficients.count(c.sel)) {
     double s = 0;
-    for (double a : kCoefs.at(c.sel)) s += std::fabs(a);
+    for (double a : kCosineCoefficients.at(c.sel)) s += std::fabs(a);
     return kEps * (n / 4 + 8) * s;
   }
   switch (c.sel) {
@@ -111,7 +97,7 @@ double Tolerance(const Case& c, int i) {
 template <class H>
 int32_t ApplyPeriodic(H h, int sel, double p) {
   constexpr bool kCx = std::is_same_v<H, CxArrayHdl>;
-  if (kCoefs.count(sel)) {
+  if (kCosineCoefficients.count(sel)) {
     if constexpr (kCx) return CxAllCosWinH(h, sel, 0);
     else return AllCosWinH(h, sel, 0);
   }
@@ -232,12 +218,12 @@ void CheckMeasuredConstants() {
 // Cosine sums scaled to unit gain: the window divided by a[0].
 void CheckScaledCosineSums() {
   for (const Case& c : Golden()) {
-    if (c.kind != "per" || !kCoefs.count(c.sel)) continue;
-    const double a0 = kCoefs.at(c.sel)[0];
+    if (c.kind != "per" || !kCosineCoefficients.count(c.sel)) continue;
+    const double a0 = kCosineCoefficients.at(c.sel)[0];
     F64 x(V(c.n, 1.0)), g(V(c.n, 1.0));
     WinConsts k{-1, -1};
     ASSERT_EQ(ScaledWinH(x.Handle(), c.sel, 0.0, &k), 0);
-    F64 a(kCoefs.at(c.sel));
+    F64 a(kCosineCoefficients.at(c.sel));
     ASSERT_EQ(ScaledGenCosWinH(g.Handle(), a.Handle()), 0);
     for (int i = 0; i < c.n; ++i) {
       ASSERT_NEAR(x.At(i), c.w[i] / a0, Tolerance(c, i) / a0) << Name(c) << " i " << i;

@@ -1,6 +1,6 @@
 /* Automatically generated from entries/exports.table, do not edit.
  * Regenerate: cmake -P tools/gen_exports.cmake
- * 86 exports. Included by tsmath.h inside its extern "C" block. */
+ * 125 exports. Included by tsmath.h inside its extern "C" block. */
 #ifndef TSMATH_EXPORTS_H
 #define TSMATH_EXPORTS_H
 
@@ -103,5 +103,46 @@ TSM_API int32_t InvDCT_2DH(MatrixHdl y, MatrixHdl x, PlanHolder** stateRows, Pla
 TSM_API int32_t InvDCT_2DH_IDP(MatrixHdl y, MatrixHdl x, ReservedTransformState** state);
 TSM_API int32_t InvDST_2DH(MatrixHdl y, MatrixHdl x, PlanHolder** stateRows, PlanHolder** stateCols);
 TSM_API int32_t InvDST_2DH_IDP(MatrixHdl y, MatrixHdl x, ReservedTransformState** state);
+
+/* Windows */
+TSM_API int32_t AllCosWinH(F64ArrayHdl x, int32_t selector, int32_t normalise);
+TSM_API int32_t CxAllCosWinH(CxArrayHdl x, int32_t selector, int32_t normalise);
+TSM_API int32_t GenCosWinH(F64ArrayHdl x, F64ArrayHdl coefs);
+TSM_API int32_t CxGenCosWinH(CxArrayHdl x, F64ArrayHdl coefs);
+TSM_API int32_t ScaledGenCosWinH(F64ArrayHdl x, F64ArrayHdl coefs);
+TSM_API int32_t ScaledCxGenCosWinH(CxArrayHdl x, F64ArrayHdl coefs);
+TSM_API int32_t BartHannWinH(F64ArrayHdl x);
+TSM_API int32_t CxBartHannWinH(CxArrayHdl x);
+TSM_API int32_t BohmanWinH(F64ArrayHdl x);
+TSM_API int32_t CxBohmanWinH(CxArrayHdl x);
+TSM_API int32_t ParzenWinH(F64ArrayHdl x);
+TSM_API int32_t CxParzenWinH(CxArrayHdl x);
+TSM_API int32_t WelchWinH(F64ArrayHdl x);
+TSM_API int32_t CxWelchWinH(CxArrayHdl x);
+TSM_API int32_t TriangleWinH(F64ArrayHdl x);
+TSM_API int32_t CxTriangleWinH(CxArrayHdl x);
+TSM_API int32_t TriangleWin(F64ArrayHdl x, int32_t* err);
+TSM_API int32_t CosTaperedH(F64ArrayHdl x, double ratio);
+TSM_API int32_t CxCosTaperedH(CxArrayHdl x, double ratio);
+TSM_API int32_t CosTapered(F64ArrayHdl x, int32_t* err);
+TSM_API int32_t DolChebyWinH(F64ArrayHdl x, double ratio, int32_t form);
+TSM_API int32_t CxDolChebyWinH(CxArrayHdl x, double ratio, int32_t form);
+TSM_API int32_t ExpWinH(F64ArrayHdl x, double final_value);
+TSM_API int32_t CxExpWinH(CxArrayHdl x, double final_value);
+TSM_API int32_t ExpWindCIN(F64ArrayHdl x, double* final_value, int32_t* err);
+TSM_API int32_t ForceWinH(F64ArrayHdl x, double duty);
+TSM_API int32_t CxForceWinH(CxArrayHdl x, double duty);
+TSM_API int32_t ForceWindCIN(F64ArrayHdl x, double* duty, int32_t* err);
+TSM_API int32_t GaussWinH(F64ArrayHdl x, double sigma, int32_t form);
+TSM_API int32_t CxGaussWinH(CxArrayHdl x, double sigma, int32_t form);
+TSM_API int32_t KaiserH(F64ArrayHdl x, double beta);
+TSM_API int32_t CxKaiserH(CxArrayHdl x, double beta);
+TSM_API int32_t Kaiser_Bessel(F64ArrayHdl x, double* beta, int32_t* err);
+TSM_API int32_t ScaledWinH(F64ArrayHdl x, int32_t selector, double param, WinConsts* consts);
+TSM_API int32_t CxScaledWinH(CxArrayHdl x, int32_t selector, double param, WinConsts* consts);
+TSM_API int32_t SymmWinH(F64ArrayHdl x, int32_t selector, double param);
+TSM_API int32_t CxSymmWinH(CxArrayHdl x, int32_t selector, double param);
+TSM_API int32_t WinConstByNameH(int32_t n, int32_t selector, double param, WinConsts* consts);
+TSM_API int32_t NumWinConstH(F64ArrayHdl w, WinConsts* consts);
 
 #endif

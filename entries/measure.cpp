@@ -7,6 +7,7 @@
 // and its registration stay.
 #include <cstdlib>
 #include <cstring>
+#include <initializer_list>
 
 #include "frame/host.h"
 #include "frame/handles.h"
@@ -100,15 +101,14 @@ ErrorCode Measure(F64ArrayHdl x, f64 t0, f64 dt, const ReferenceLevels* refs, co
   return kernel(rq);
 }
 
-// Outputs the caller may leave out.
-void Put(f64* out, f64 v) {
-  if (out != nullptr) *out = v;
-}
-
-void PutLevels(const References& r, f64* low, f64* mid, f64* high) {
-  Put(low, r.low);
-  Put(mid, r.mid);
-  Put(high, r.high);
+// Outputs and their values; an output the caller left out (null) is skipped.
+struct Output {
+  f64* to;
+  f64 value;
+};
+void Put(std::initializer_list<Output> outputs) {
+  for (const Output& o : outputs)
+    if (o.to != nullptr) *o.to = o.value;
 }
 
 WaveformRequest Asking(int32 polarity, bool ignorePeriod, int32 number) {
@@ -135,9 +135,7 @@ int32_t StateLevels(F64ArrayHdl x, double t0, double dt, uint32_t method, int32_
     e = FindStateLevels(rq.x, rq.n, rq.dt, rq.levels, &s);
   }
   if (e != TSM_SUCCESS) s.high = s.low = s.amplitude = kNaN;
-  Put(high, s.high);
-  Put(low, s.low);
-  Put(amplitude, s.amplitude);
+  Put({{high, s.high}, {low, s.low}, {amplitude, s.amplitude}});
   return e;
 }
 
@@ -149,11 +147,8 @@ int32_t PulseMeasEx(F64ArrayHdl x, double t0, double dt, uint16_t polarity, uint
   const ErrorCode e = Measure(x, t0, dt, refs, levels, histogram, option,
                               Asking(polarity, ignorePeriod != 0, pulseNumber),
                               [&](const WaveformRequest& rq) { return MeasurePulse(rq, &f); });
-  Put(period, f.period);
-  Put(width, f.width);
-  Put(dutyCycle, f.dutyCycle);
-  Put(center, f.center);
-  PutLevels(f.refs, lowLevel, midLevel, highLevel);
+  Put({{period, f.period}, {width, f.width}, {dutyCycle, f.dutyCycle}, {center, f.center}, {lowLevel, f.refs.low},
+       {midLevel, f.refs.mid}, {highLevel, f.refs.high}});
   return e;
 }
 
@@ -172,11 +167,8 @@ int32_t CycleRMSAverage(F64ArrayHdl x, double t0, double dt, int32_t cycleNumber
   CycleFigures f{};
   const ErrorCode e = Measure(x, t0, dt, refs, levels, histogram, option, Asking(-1, false, cycleNumber),
                               [&](const WaveformRequest& rq) { return MeasureCycle(rq, &f); });
-  Put(mean, f.mean);
-  Put(rms, f.rms);
-  Put(start, f.start);
-  Put(end, f.end);
-  PutLevels(f.refs, lowLevel, midLevel, highLevel);
+  Put({{mean, f.mean}, {rms, f.rms}, {start, f.start}, {end, f.end}, {lowLevel, f.refs.low}, {midLevel, f.refs.mid},
+       {highLevel, f.refs.high}});
   return e;
 }
 
@@ -188,15 +180,9 @@ int32_t TransMeas(F64ArrayHdl x, double t0, double dt, uint16_t polarity, int32_
   TransitionFigures f{};
   const ErrorCode e = Measure(x, t0, dt, refs, levels, histogram, option, Asking(polarity, false, transitionNumber),
                               [&](const WaveformRequest& rq) { return MeasureTransition(rq, &f); });
-  Put(slope, f.slope);
-  Put(duration, f.duration);
-  Put(start, f.start);
-  Put(end, f.end);
-  PutLevels(f.refs, lowLevel, midLevel, highLevel);
-  Put(preshootUnder, f.preUnder);
-  Put(preshootOver, f.preOver);
-  Put(postshootUnder, f.postUnder);
-  Put(postshootOver, f.postOver);
+  Put({{slope, f.slope}, {duration, f.duration}, {start, f.start}, {end, f.end}, {lowLevel, f.refs.low},
+       {midLevel, f.refs.mid}, {highLevel, f.refs.high}, {preshootUnder, f.preUnder}, {preshootOver, f.preOver},
+       {postshootUnder, f.postUnder}, {postshootOver, f.postOver}});
   return e;
 }
 

@@ -8,15 +8,14 @@
 #include <cmath>
 #include <functional>
 #include <limits>
+#include <random>
 #include <vector>
 
 #include "support/host_arrays.h"
-#include "waveforms.h"
 
 namespace {
 
 using tsmtest::F64;
-using tsmtest::Trapezoid;
 using V = std::vector<double>;
 
 constexpr double kPreset = 777.0;  // stale value in every output before a call
@@ -25,8 +24,46 @@ constexpr double kPreset = 777.0;  // stale value in every output before a call
 class Measure : public ::testing::Test {
  protected:
   void TearDown() override { tsrt_end_run(); }
-  HistogramBuffer* hist_ = nullptr;
 };
+
+// A periodic trapezoid in continuous time; its crossing instants are closed forms.
+struct Trapezoid {
+  double low, high;
+  double delay;                    // start of the first rise
+  double rise, top, fall, period;  // ramp durations, high plateau, period
+
+  double operator()(double t) const {
+    double u = std::fmod(t - delay, period);
+    if (u < 0) u += period;
+    const double span = high - low;
+    if (u < rise) return low + span * u / rise;
+    if (u < rise + top) return high;
+    return u < rise + top + fall ? high - span * (u - rise - top) / fall : low;
+  }
+  // Instant at which rise k (from 0) or fall k passes level v.
+  double RiseAt(int k, double v) const { return delay + k * period + (v - low) / (high - low) * rise; }
+  double FallAt(int k, double v) const { return delay + k * period + rise + top + (high - v) / (high - low) * fall; }
+  // Samples at t0 + i dt, with uniform noise of the given bound.
+  V Sample(double t0, double dt, int n, double noise = 0) const {
+    std::mt19937_64 gen(7);
+    std::uniform_real_distribution<double> u(-noise, noise);
+    V x(n);
+    for (int i = 0; i < n; ++i) x[i] = (*this)(t0 + i * dt) + (noise > 0 ? u(gen) : 0.0);
+    return x;
+  }
+};
+
+// Mean and sum of squares of x[from, to) in long double.
+double LongMean(const V& x, int from, int to) {
+  long double s = 0;
+  for (int i = from; i < to; ++i) s += x[i];
+  return static_cast<double>(s / (to - from));
+}
+double LongSumSquares(const V& x, int from, int to) {
+  long double s = 0;
+  for (int i = from; i < to; ++i) s += static_cast<long double>(x[i]) * x[i];
+  return static_cast<double>(s);
+}
 
 ReferenceLevels Percent(double lo = 10, double mid = 50, double hi = 90) { return {hi, mid, lo, 1}; }
 ReferenceLevels Units(double lo, double mid, double hi) { return {hi, mid, lo, 0}; }
@@ -76,17 +113,20 @@ struct Call {
   ReferenceLevels refs = Percent();
   LevelMethod how = {0, 100};
   int32_t option = 0;
-  const ReferenceLevels* refsPtr() const { return &refs; }
+  bool noRecord = false;  // pass a null ReferenceLevels
 };
 
-// period, width, duty, centre, low, mid, high
-Outcome RunPulse(const V& xs, const Call& c, const ReferenceLevels* refs = nullptr, bool useRefs = true) {
+// period, width, duty, centre, low, mid, high; PulseMeas unless ignorePeriod is set.
+Outcome RunPulse(const V& xs, const Call& c) {
   F64 x(xs);
   HistogramBuffer* var = nullptr;
   Outcome r{0, V(7, kPreset)};
   double* o = r.out.data();
-  r.code = PulseMeasEx(x.Handle(), c.t0, c.dt, c.polarity, c.ignorePeriod, c.number, useRefs ? &c.refs : refs,
-                       &c.how, &var, o, o + 1, o + 2, o + 3, o + 4, o + 5, o + 6, c.option);
+  const ReferenceLevels* refs = c.noRecord ? nullptr : &c.refs;
+  r.code = c.ignorePeriod ? PulseMeasEx(x.Handle(), c.t0, c.dt, c.polarity, 1, c.number, refs, &c.how, &var, o,
+                                        o + 1, o + 2, o + 3, o + 4, o + 5, o + 6, c.option)
+                          : PulseMeas(x.Handle(), c.t0, c.dt, c.polarity, c.number, refs, &c.how, &var, o, o + 1,
+                                      o + 2, o + 3, o + 4, o + 5, o + 6, c.option);
   return r;
 }
 // mean, rms, start, end, low, mid, high
@@ -187,7 +227,7 @@ TEST_F(Measure, TrapezoidTrainsGiveTheirClosedForms) {
           const double rise = shortRamp ? 3 * dt : 0.012;
           const Trapezoid tz{low, high, 0.02 + offset * dt, rise, 0.04, 1.25 * rise, period};
           const int n = static_cast<int>(5 * period / dt);
-          const V x = tz.Sample(t0, dt, n, noise, 7);
+          const V x = tz.Sample(t0, dt, n, noise);
           SCOPED_TRACE(testing::Message() << "dt " << dt << " offset " << offset << " noise " << noise
                                           << " short " << shortRamp);
           // States half a bin inside the extremes; references 10/50/90%.
@@ -218,8 +258,8 @@ TEST_F(Measure, TrapezoidTrainsGiveTheirClosedForms) {
           EXPECT_NEAR(cy.out[3], r1 + period, 2 * tolT);
           const int count = static_cast<int>(period / dt + 0.5), first = static_cast<int>(0.5 + (r1 - t0) / dt);
           const double tolM = noise > 0 ? 2 * span / count : 1e-12;
-          EXPECT_NEAR(cy.out[0], tsmtest::LongMean(x, first, first + count), tolM);
-          EXPECT_NEAR(cy.out[1], std::sqrt(tsmtest::LongSumSquares(x, first, first + count) / count), tolM);
+          EXPECT_NEAR(cy.out[0], LongMean(x, first, first + count), tolM);
+          EXPECT_NEAR(cy.out[1], std::sqrt(LongSumSquares(x, first, first + count) / count), tolM);
 
           for (uint16_t pol : {1, 0}) {
             c.polarity = pol;
@@ -242,19 +282,19 @@ TEST_F(Measure, FetchGivesEverySelector) {
   const V x = FeatureWave();
   const double t0 = 0.25, dt = 2e-3;
   const auto at = [&](double p) { return t0 + p * dt; };
-  const double rms = std::sqrt(tsmtest::LongSumSquares(x, 0, 400) / 400);
-  const double cycleRms = std::sqrt(tsmtest::LongSumSquares(x, 0, 100) / 100);
+  const double rms = std::sqrt(LongSumSquares(x, 0, 400) / 400);
+  const double cycleRms = std::sqrt(LongSumSquares(x, 0, 100) / 100);
   constexpr double nan = std::numeric_limits<double>::quiet_NaN();
   struct Case {
     int32_t selector;
     double value, start = nan, end = nan;
   } cases[] = {
       {0, -0.05}, {1, 1.15}, {2, 1.2}, {3, 0}, {4, 1}, {5, 1}, {6, 1}, {7, 0}, {8, 1},
-      {9, 0.1}, {10, 0.5}, {11, 0.9}, {12, 0.4}, {13, rms}, {14, tsmtest::LongMean(x, 0, 400)},
+      {9, 0.1}, {10, 0.5}, {11, 0.9}, {12, 0.4}, {13, rms}, {14, LongMean(x, 0, 400)},
       {15, 100 * dt}, {16, 1 / (100 * dt)},
-      {17, cycleRms, at(120.3), at(220.3)}, {18, tsmtest::LongMean(x, 0, 100), at(120.3), at(220.3)},
+      {17, cycleRms, at(120.3), at(220.3)}, {18, LongMean(x, 0, 100), at(120.3), at(220.3)},
       {19, 16 * dt, at(152.3), at(168.3)}, {20, 16 * dt, at(112.3), at(128.3)},
-      {21, std::sqrt(tsmtest::LongSumSquares(x, 0, 400))},
+      {21, std::sqrt(LongSumSquares(x, 0, 400))},
       {22, 40 * dt}, {23, 60 * dt}, {24, 0.4}, {25, 0.6},
       {26, 3, at(112.3), at(128.3)}, {27, 8, at(152.3), at(168.3)},
       {28, 15, at(112.3), at(128.3)}, {29, 5, at(152.3), at(168.3)},
@@ -346,7 +386,7 @@ TEST_F(Measure, FailuresLeaveTheirOutputsZero) {
     Run run;
     int32_t code;
   } cases[] = {
-      {"no record", [&] { return RunPulse(wave, base, nullptr, false); }, TSM_ERR_MISSING_RECORD},
+      {"no record", pulse(wave, with([](Call& c) { c.noRecord = true; })), TSM_ERR_MISSING_RECORD},
       {"no bins", pulse(wave, with([](Call& c) { c.how.bins = 0; })), TSM_ERR_BIN_COUNT},
       {"method 3", trans(wave, with([](Call& c) { c.how.method = 3; })), TSM_ERR_METHOD_SELECTOR},
       {"pulse 0", pulse(wave, with([](Call& c) { c.number = 0; })), TSM_ERR_PULSE_NUMBER},

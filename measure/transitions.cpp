@@ -108,17 +108,19 @@ ErrorCode MeasureTransition(const WaveformRequest& rq, TransitionFigures* out) {
   TransitionFigures f{};
   f.refs = r;
 
-  int32 left = k == 0 ? 0 : (list[k - 1].last + t.first) / 2;
-  if (option == 1) left = std::max(left, t.first - 3 * w);
+  // Bounds in 64 bits: midpoints and three widths may pass the int32 range.
+  using I64 = std::int64_t;
+  I64 left = k == 0 ? 0 : (I64{list[k - 1].last} + t.first) / 2;
+  if (option == 1) left = std::max(left, I64{t.first} - 3 * I64{w});
   int32 j = t.first;
   while (j > left + 1 && !(rising ? rq.x[j] <= s.low : rq.x[j] >= s.high)) --j;
-  const Shoot pre = ShootOf(rq.x, left, j, rising ? s.low : s.high, amplitude);
+  const Shoot pre = ShootOf(rq.x, static_cast<int32>(left), j, rising ? s.low : s.high, amplitude);
 
-  int32 right = k + 1 < count ? (t.last + list[k + 1].first) / 2 : rq.n - 1;
-  if (option == 1) right = std::min(right, t.last + 3 * w);
+  I64 right = k + 1 < count ? (I64{t.last} + list[k + 1].first) / 2 : rq.n - 1;
+  if (option == 1) right = std::min(right, I64{t.last} + 3 * I64{w});
   j = t.last;
   while (j < right - 1 && !(rising ? rq.x[j] >= s.high : rq.x[j] <= s.low)) ++j;
-  const Shoot post = ShootOf(rq.x, j, right, rising ? s.high : s.low, amplitude);
+  const Shoot post = ShootOf(rq.x, j, static_cast<int32>(right), rising ? s.high : s.low, amplitude);
   f.preUnder = pre.under;
   f.preOver = pre.over;
   f.postUnder = post.under;

@@ -446,6 +446,26 @@ TEST_F(Measure, FailuresLeaveTheirOutputsZero) {
   }
 }
 
+// Crossing and transition lists come from the workspace: the same figures
+// inside an arena, -20311 when the arena cannot hold them.
+TEST_F(Measure, ListsComeFromTheWorkspace) {
+  const V x = FeatureWave();
+  const Call c{0, 1, 2};
+  const Outcome heap = RunPulse(x, c);
+  for (uint32_t size : {1u << 16, 48u}) {
+    ErrorCluster err{0, 0};
+    InitializeAnalysisWorkspaceH(size, &err);
+    EnableAnalysisWorkspaceH(&err);
+    const Outcome pulse = RunPulse(x, c), trans = RunTrans(x, c);
+    DisableAnalysisWorkspaceH(&err);
+    UninitializeAnalysisWorkspaceH(&err);
+    ASSERT_EQ(err.status, 0);
+    EXPECT_EQ(pulse.code, size > 48 ? 0 : TSM_ERR_NO_PULSE);
+    EXPECT_EQ(trans.code, size > 48 ? 0 : TSM_ERR_NO_PULSE);
+    if (size > 48) EXPECT_EQ(pulse.out, heap.out);
+  }
+}
+
 // The buffer is made on the first call, keeps its record when the bin count
 // changes, and goes with the host's clean-up at the end of the run.
 TEST_F(Measure, HistogramBufferLivesUntilTheHostCleansUp) {

@@ -462,7 +462,9 @@ TEST_F(Measure, ListsComeFromTheWorkspace) {
     ASSERT_EQ(err.status, 0);
     EXPECT_EQ(pulse.code, size > 48 ? 0 : TSM_ERR_NO_PULSE);
     EXPECT_EQ(trans.code, size > 48 ? 0 : TSM_ERR_NO_PULSE);
-    if (size > 48) EXPECT_EQ(pulse.out, heap.out);
+    if (size > 48) {
+      EXPECT_EQ(pulse.out, heap.out);
+    }
   }
 }
 

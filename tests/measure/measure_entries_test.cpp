@@ -313,6 +313,10 @@ TEST_F(Measure, FetchGivesEverySelector) {
     EXPECT_NEAR(times[0], std::isnan(c.start) ? kPreset : c.start, 1e-12) << c.selector;
     EXPECT_NEAR(times[1], std::isnan(c.end) ? kPreset : c.end, 1e-12) << c.selector;
   }
+  // Positions that all round to t0 = 1e20 make a period of 0: infinite frequency, no code.
+  double frequency = 0;
+  EXPECT_EQ(measurements_fetch(nullptr, 16, &refs, &how, 2, 1e20, dt, x.data(), 400, &frequency, nullptr), 0);
+  EXPECT_EQ(frequency, std::numeric_limits<double>::infinity());
   for (int32_t selector : {34, -1, 1000}) {
     double result = kPreset;
     EXPECT_EQ(measurements_fetch(nullptr, selector, &refs, &how, 2, t0, dt, x.data(), 400, &result, nullptr), 0);

@@ -4,9 +4,8 @@
 #include <cmath>
 
 namespace tsm {
-namespace {
 
-// Sum of squares unrolled by four, with four partial sums; the tail singly.
+// Four partial sums; the tail singly.
 f64 SumOfSquares(const f64* x, int32 n) {
   f64 s0 = 0, s1 = 0, s2 = 0, s3 = 0;
   int32 i = 0;
@@ -20,6 +19,8 @@ f64 SumOfSquares(const f64* x, int32 n) {
   for (; i < n; ++i) s += x[i] * x[i];
   return s;
 }
+
+namespace {
 
 f64 PlainMean(const f64* x, int32 n) {
   f64 s = 0;

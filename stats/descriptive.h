@@ -6,6 +6,9 @@
 
 namespace tsm {
 
+// Sum of squares, unrolled by four.
+f64 SumOfSquares(const f64* x, int32 n);
+
 // Arithmetic mean.
 ErrorCode MeanOfArray(const f64* x, int32 n, f64* mean);
 

@@ -64,7 +64,22 @@ typedef struct GenHistIntervalArray { int32_t count; GenHistInterval elt[1]; } G
 /* Constants of a window: equivalent noise bandwidth in bins, then coherent
  * gain (the window's mean). */
 typedef struct WinConsts { double enbw; double cg; } WinConsts;
+
+/* Reference levels of the pulse and transition measurements, high, middle and
+ * low; with percent non-zero they are percentages of the amplitude above the
+ * low state, otherwise signal units. 26 bytes. */
+typedef struct ReferenceLevels { double highRef; double midRef; double lowRef; uint16_t percent; } ReferenceLevels;
+
+/* How the state levels are found. method: 0 histogram, 1 minimum and maximum,
+ * 2 histogram where populated, else the extremes. bins: histogram bins. */
+typedef struct LevelMethod { uint32_t method; int32_t bins; } LevelMethod;
 #pragma pack(pop)
+
+/* Histogram counters kept between calls of a measurement entry in a variable
+ * of the caller's (null at first). The entry makes the record, gives it new
+ * counters when the bin count changes, and registers its release with the
+ * host's RTSetCleanupProc (mode 2) when it makes it. */
+typedef struct HistogramBuffer { int32_t bins; int32_t* counts; } HistogramBuffer;
 
 /* Samples of the general histogram that fell in no interval (total), below the
  * first interval (below) and beyond the last (above). */

@@ -1,6 +1,6 @@
 /* Automatically generated from entries/exports.table, do not edit.
  * Regenerate: cmake -P tools/gen_exports.cmake
- * 125 exports. Included by tsmath.h inside its extern "C" block. */
+ * 134 exports. Included by tsmath.h inside its extern "C" block. */
 #ifndef TSMATH_EXPORTS_H
 #define TSMATH_EXPORTS_H
 
@@ -144,5 +144,16 @@ TSM_API int32_t SymmWinH(F64ArrayHdl x, int32_t selector, double param);
 TSM_API int32_t CxSymmWinH(CxArrayHdl x, int32_t selector, double param);
 TSM_API int32_t WinConstByNameH(int32_t n, int32_t selector, double param, WinConsts* consts);
 TSM_API int32_t NumWinConstH(F64ArrayHdl w, WinConsts* consts);
+
+/* Pulse measurement */
+TSM_API int32_t StateLevels(F64ArrayHdl x, double t0, double dt, uint32_t method, int32_t bins, HistogramBuffer** histogram, double* high, double* low, double* amplitude, int32_t option);
+TSM_API int32_t PulseMeasEx(F64ArrayHdl x, double t0, double dt, uint16_t polarity, uint8_t ignorePeriod, int32_t pulseNumber, const ReferenceLevels* refs, const LevelMethod* levels, HistogramBuffer** histogram, double* period, double* width, double* dutyCycle, double* center, double* lowLevel, double* midLevel, double* highLevel, int32_t option);
+TSM_API int32_t PulseMeas(F64ArrayHdl x, double t0, double dt, uint16_t polarity, int32_t pulseNumber, const ReferenceLevels* refs, const LevelMethod* levels, HistogramBuffer** histogram, double* period, double* width, double* dutyCycle, double* center, double* lowLevel, double* midLevel, double* highLevel, int32_t option);
+TSM_API int32_t CycleRMSAverage(F64ArrayHdl x, double t0, double dt, int32_t cycleNumber, const ReferenceLevels* refs, const LevelMethod* levels, HistogramBuffer** histogram, double* mean, double* rms, double* start, double* end, double* lowLevel, double* midLevel, double* highLevel, int32_t option);
+TSM_API int32_t TransMeas(F64ArrayHdl x, double t0, double dt, uint16_t polarity, int32_t transitionNumber, const ReferenceLevels* refs, const LevelMethod* levels, HistogramBuffer** histogram, double* slope, double* duration, double* start, double* end, double* lowLevel, double* midLevel, double* highLevel, double* preshootUnder, double* preshootOver, double* postshootUnder, double* postshootOver, int32_t option);
+TSM_API int32_t measurements_fetch(void* reserved, int32_t selector, const ReferenceLevels* refs, const LevelMethod* levels, int32_t pulseNumber, double t0, double dt, const double* data, int32_t n, double* result, double* times);
+TSM_API int32_t measurements_create(void* object);
+TSM_API int32_t measurements_clear(void* object);
+TSM_API int32_t measurements_destroy(void* object);
 
 #endif

@@ -1,0 +1,47 @@
+// Shared pieces of the special-function kernels: machine constants, the
+// classification helpers, polynomial evaluation and the error hook.
+//
+// Kernels report a bad argument only through the value they return (NaN, an
+// infinity or a limit); just before such a return they call MathErrorHook
+// with the kind of error, the one place where a build may log them.
+#pragma once
+
+#include "frame/types.h"
+
+namespace tsm {
+
+inline constexpr f64 kMachEp = 2.220446049250313e-16;
+inline constexpr f64 kMaxLog = 709.782712893384;
+inline constexpr f64 kBig = 144115188075855872.0;  // 2^57
+inline constexpr f64 kBigInv = 6.938893903907228e-18;
+inline constexpr f64 kEuler = 0.5772156649015329;
+
+enum MathErrorType : int32 { kMathDomain = 0, kMathSingularity = 1, kMathOverflow = 2 };
+
+// Called by every domain, singularity and overflow path; does nothing.
+void MathErrorHook(int32 kind, int32 type);
+
+// True for any NaN, signalling or quiet.
+bool IsNaNValue(f64 x);
+// True unless the exponent field is all ones.
+bool IsFiniteValue(f64 x);
+// 0 for a finite value or NaN, +1 for plus infinity, -1 for minus infinity.
+int32 InfinitySign(f64 x);
+
+// coef[0] x^n + ... + coef[n] by Horner's rule (n + 1 coefficients).
+f64 PolyEval(f64 x, const f64* coef, int32 n);
+// The same with an implied leading coefficient 1 and n stored coefficients:
+// x^n + coef[0] x^(n-1) + ... + coef[n-1].
+f64 PolyEval1(f64 x, const f64* coef, int32 n);
+
+// The code every kernel passes to the hook.
+inline constexpr int32 kMathKernel = 1;
+
+// Calls the hook with `type` and returns `value`: the shape of every error
+// return of the kernels.
+inline f64 MathError(int32 type, f64 value) {
+  MathErrorHook(kMathKernel, type);
+  return value;
+}
+
+}  // namespace tsm

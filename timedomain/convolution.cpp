@@ -36,7 +36,9 @@ int32 SmoothLength(int32 n, int32 m) {
   return full > 0x7FFFFFFF ? 0 : kwfft_next_smooth_length(static_cast<int32>(full));
 }
 
-ErrorCode ConvolveFft(const f64* x, int32 n, const f64* y, int32 m, f64* out) {
+}  // namespace
+
+ErrorCode ConvolveByFft(const f64* x, int32 n, bool reverseX, const f64* y, int32 m, f64* out) {
   const int32 L = SmoothLength(n, m);
   if (L == 0) return TSM_ERR_NO_MEMORY;
   Scratch<f64> s;
@@ -45,7 +47,10 @@ ErrorCode ConvolveFft(const f64* x, int32 n, const f64* y, int32 m, f64* out) {
   f64* second = first + L;
   f64* third = second + L;
   std::fill(first, third, 0.0);
-  std::copy(x, x + n, first);
+  if (reverseX)
+    std::reverse_copy(x, x + n, first);
+  else
+    std::copy(x, x + n, first);
   std::copy(y, y + m, second);
   const PlanRef plan(L);
   if (plan.get() == nullptr) return TSM_ERR_NO_MEMORY;
@@ -57,6 +62,8 @@ ErrorCode ConvolveFft(const f64* x, int32 n, const f64* y, int32 m, f64* out) {
   std::copy(first, first + (n + m - 1), out);
   return TSM_SUCCESS;
 }
+
+namespace {
 
 // Each output value is one inner product of the reversed shorter operand
 // with the part of the longer one under it.
@@ -114,7 +121,7 @@ ErrorCode Convolve(const f64* x, int32 n, const f64* y, int32 m, int32 algorithm
     }
     return TSM_SUCCESS;
   }
-  if (algorithm == kConvolveFft) return ConvolveFft(x, n, y, m, out);
+  if (algorithm == kConvolveFft) return ConvolveByFft(x, n, false, y, m, out);
   return TSM_SUCCESS;
 }
 

@@ -21,6 +21,9 @@ void ConjProductMultiply(const f64* A, const f64* B, f64* C, int32 n);
 // Real convolution into out (n + m - 1 values). Any other algorithm writes
 // nothing and returns 0.
 ErrorCode Convolve(const f64* x, int32 n, const f64* y, int32 m, int32 algorithm, f64* out);
+// The FFT path of real convolution (of reversed x, for correlation): one
+// transform length from kwfft_next_smooth_length(n + m - 1), scratch of 3L.
+ErrorCode ConvolveByFft(const f64* x, int32 n, bool reverseX, const f64* y, int32 m, f64* out);
 // Complex convolution: -20003 for an empty operand, -20061 for another
 // algorithm.
 ErrorCode CxConvolve(const cx* x, int32 n, const cx* y, int32 m, cx* out, int32 algorithm);

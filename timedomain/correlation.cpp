@@ -56,28 +56,6 @@ ErrorCode AutoCorrelateFft(const f64* x, int32 n, f64* out) {
   return TSM_SUCCESS;
 }
 
-ErrorCode CrossCorrelateFft(const f64* x, int32 n, const f64* y, int32 m, f64* out) {
-  const int32 L = kwfft_next_smooth_length(n + m - 1);
-  if (L == 0) return TSM_ERR_NO_MEMORY;
-  Scratch<f64> s;
-  if (s.Allocate(3 * static_cast<std::int64_t>(L)) != TSM_SUCCESS) return TSM_ERR_NO_MEMORY;
-  f64* first = s.get();
-  f64* second = first + L;
-  f64* third = second + L;
-  std::fill(first, third, 0.0);
-  std::reverse_copy(x, x + n, first);
-  std::copy(y, y + m, second);
-  const PlanRef plan(L);
-  if (plan.get() == nullptr) return TSM_ERR_NO_MEMORY;
-  ErrorCode e = kwfft_real(plan.get(), first, third, 1, 1, L);
-  if (e == TSM_SUCCESS) e = kwfft_real(plan.get(), second, first, 1, 1, L);
-  if (e != TSM_SUCCESS) return e;
-  ConjProductMultiply(third, first, second, L);
-  if ((e = kwfft_real_inverse(plan.get(), second, first, 1, 1, L)) != TSM_SUCCESS) return e;
-  std::copy(first, first + (n + m - 1), out);
-  return TSM_SUCCESS;
-}
-
 }  // namespace
 
 ErrorCode Correlate(const f64* x, int32 n, const f64* y, int32 m, int32 algorithm, f64* out, int32 normalization) {
@@ -90,7 +68,7 @@ ErrorCode Correlate(const f64* x, int32 n, const f64* y, int32 m, int32 algorith
       for (int32 i = 0; i < n; ++i) o[i] += w * x[n - 1 - i];
     }
   } else if (algorithm == kConvolveFft) {
-    e = x == y ? AutoCorrelateFft(x, n, out) : CrossCorrelateFft(x, n, y, m, out);
+    e = x == y ? AutoCorrelateFft(x, n, out) : ConvolveByFft(x, n, true, y, m, out);
   }
   if (e != TSM_SUCCESS) return e;
   return Normalize(out, n, m, normalization);

@@ -10,6 +10,15 @@
 namespace tsm {
 namespace {
 
+// s[j] = x[r + j a], zero past the input.
+template <class T>
+void Gather(const T* x, int32 n, int32 r, int32 a, int32 m, T* s) {
+  for (int32 j = 0; j < m; ++j) {
+    const std::int64_t t = r + static_cast<std::int64_t>(j) * a;
+    s[j] = t < n ? x[t] : T{};
+  }
+}
+
 // Phase r's length-m spectrum S_r, read at bin j.
 struct RealPhase {
   const kwfft_table* plan;
@@ -17,10 +26,7 @@ struct RealPhase {
   HeapArray<f64> s, h;
   ErrorCode Allocate() { return s.Allocate(m) == TSM_SUCCESS ? h.Allocate(m) : TSM_ERR_NO_MEMORY; }
   ErrorCode Transform(const f64* x, int32 n, int32 r, int32 a) {
-    for (int32 j = 0; j < m; ++j) {
-      const std::int64_t t = r + static_cast<std::int64_t>(j) * a;
-      s[j] = t < n ? x[t] : 0.0;
-    }
+    Gather(x, n, r, a, m, s.get());
     return kwfft_real(plan, s.get(), h.get(), 1, 1, m);
   }
   // Bins 0 and m/2 are real; above m/2 the conjugate of the mirror bin.
@@ -36,10 +42,7 @@ struct ComplexPhase {
   HeapArray<cx> s, S;
   ErrorCode Allocate() { return s.Allocate(m) == TSM_SUCCESS ? S.Allocate(m) : TSM_ERR_NO_MEMORY; }
   ErrorCode Transform(const cx* x, int32 n, int32 r, int32 a) {
-    for (int32 j = 0; j < m; ++j) {
-      const std::int64_t t = r + static_cast<std::int64_t>(j) * a;
-      s[j] = t < n ? x[t] : cx{0.0, 0.0};
-    }
+    Gather(x, n, r, a, m, s.get());
     return kwfft_complex(plan, &s[0].re, &s[0].im, &S[0].re, &S[0].im, 2, 2, m);
   }
   cx Bin(int32 j) const { return S[j]; }

@@ -11,6 +11,8 @@
 #include <vector>
 
 #include "support/host_arrays.h"
+#include "support/host_fixture.h"
+#include "support/random_data.h"
 #include "support/reference_dft.h"
 
 namespace tsmtest {
@@ -18,25 +20,9 @@ namespace {
 
 using CV = std::vector<cx>;
 
-CV RandomCx(int n, unsigned seed) {
-  std::mt19937 rng(seed);
-  std::uniform_real_distribution<double> u(-1, 1);
-  CV v(n);
-  for (cx& z : v) z = cx{u(rng), u(rng)};
-  return v;
-}
-
 double Dist(cx a, CxL b) { return static_cast<double>(std::abs(CxL(a.re, a.im) - b)); }
 
-class ChirpZ : public ::testing::Test {
- protected:
-  void SetUp() override { blocks_ = tsrt_live_blocks(); }
-  void TearDown() override {
-    tsrt_end_run();
-    EXPECT_EQ(tsrt_live_blocks(), blocks_);
-  }
-  int64_t blocks_ = 0;
-};
+using ChirpZ = HostRunTest;
 
 // Every power is taken in polar form, so a term's phase is off by up to
 // (i |log A| + i k |log W|) eps; the bound is 16 eps of each term's magnitude

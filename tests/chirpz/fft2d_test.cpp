@@ -7,6 +7,8 @@
 #include <vector>
 
 #include "support/host_arrays.h"
+#include "support/host_fixture.h"
+#include "support/random_data.h"
 #include "support/host_matrix.h"
 #include "support/reference_dft.h"
 
@@ -14,14 +16,6 @@ namespace tsmtest {
 namespace {
 
 using CV = std::vector<cx>;
-
-CV RandomCx(int n, unsigned seed) {
-  std::mt19937 rng(seed);
-  std::uniform_real_distribution<double> u(-1, 1);
-  CV v(n);
-  for (cx& z : v) z = cx{u(rng), u(rng)};
-  return v;
-}
 
 // The rows x cols window from (ro, co), zero outside the input.
 CV Window(const CV& x, int inR, int inC, int ro, int co, int rows, int cols) {
@@ -48,15 +42,7 @@ std::vector<CxL> Dft2D(const CV& w, int rows, int cols) {
 
 int Slot(int k, int n, bool shift) { return shift ? (n / 2 + k) % n : k; }
 
-class Fft2D : public ::testing::Test {
- protected:
-  void SetUp() override { blocks_ = tsrt_live_blocks(); }
-  void TearDown() override {
-    tsrt_end_run();
-    EXPECT_EQ(tsrt_live_blocks(), blocks_);
-  }
-  int64_t blocks_ = 0;
-};
+using Fft2D = HostRunTest;
 
 struct Frame {
   int inR, inC, ro, co, rows, cols, shift;

@@ -9,20 +9,14 @@
 #include <vector>
 
 #include "support/host_arrays.h"
+#include "support/host_fixture.h"
 #include "support/host_matrix.h"
+#include "support/random_data.h"
 
 namespace tsmtest {
 namespace {
 
 using V = std::vector<double>;
-
-V Random(int n, unsigned seed) {
-  std::mt19937 rng(seed);
-  std::uniform_real_distribution<double> u(-1, 1);
-  V v(n);
-  for (double& d : v) d = u(rng);
-  return v;
-}
 
 V DirectConvolution(const V& a, const V& b) {
   std::vector<long double> r(a.size() + b.size() - 1);
@@ -31,12 +25,7 @@ V DirectConvolution(const V& a, const V& b) {
   return V(r.begin(), r.end());
 }
 
-class ConvEntries : public ::testing::Test {
- protected:
-  void SetUp() override { blocks_ = tsrt_live_blocks(); }
-  void TearDown() override { EXPECT_EQ(tsrt_live_blocks(), blocks_); }
-  int64_t blocks_ = 0;
-};
+using ConvEntries = HostRunTest;
 
 TEST_F(ConvEntries, FormAChecksAndEmptiesTheOutput) {
   struct Case {
@@ -117,7 +106,7 @@ TEST_F(ConvEntries, MatrixChecksInOrder) {
 
 TEST_F(ConvEntries, AutoCorrelationMatchesRxyWithZeroLagAtTheMiddle) {
   for (int n : {1, 2, 7, 64, 101}) {
-    const V xs = Random(n, n);
+    const V xs = RandomReal(n, n);
     for (int32_t norm : {0, 1, 2}) {
       F64 x(xs), a(xs), b(xs), r;
       int32_t err = 1, alg = 0;
@@ -154,13 +143,13 @@ TEST_F(ConvEntries, DeconvolutionRecoversTheQuotientByEitherPath) {
   } cases[] = {
       {{2.0, -0.5, 0.25}, 40, "spectral"},
       {{1.5}, 1, "spectral, one sample"},
-      {Random(9, 3), 1, "spectral, n == m"},
+      {RandomReal(9, 3), 1, "spectral, n == m"},
       {{1.0, 1.0}, 31, "zero at the Nyquist bin"},
       {{0.0, 0.0, 1.0, 1.0}, 13, "leading zeros and a spectral zero"},
       {{1.0, 0.0, 1.0}, 10, "zero at a quarter of the rate"},
   };
   for (const Case& c : cases) {
-    const V q = Random(c.q, c.q + 17);
+    const V q = RandomReal(c.q, c.q + 17);
     F64 x(DirectConvolution(q, c.y)), y(c.y);
     int32_t err = 1;
     ASSERT_EQ(Deconvolution(x.Handle(), y.Handle(), &err), 0);
@@ -199,7 +188,7 @@ TEST_F(ConvEntries, ResizeFailureAtEachResize) {
     EXPECT_EQ(made, 1);
     EXPECT_EQ(err, 0);
   };
-  const V a = Random(6, 1), b = Random(4, 2);
+  const V a = RandomReal(6, 1), b = RandomReal(4, 2);
   F64 x(a), y(b), out;
   int32_t alg = 1;
   formA([&](int32_t* e) { return Convolution(x.Handle(), y.Handle(), out.Handle(), &alg, e); },
@@ -231,7 +220,7 @@ TEST_F(ConvEntries, ResizeFailureAtEachResize) {
                          EXPECT_EQ(ret, TSRT_MEMORY_FULL);  // the host's own result
                          EXPECT_EQ(cout.Count(), 0);
                        });
-  Mat m1(3, 3, Random(9, 4)), m2(2, 2, Random(4, 5)), mout;
+  Mat m1(3, 3, RandomReal(9, 4)), m2(2, 2, RandomReal(4, 5)), mout;
   for (int32_t size : {0, 1, 2})
     RunFailingEachResize([&] { return Convolve_2DH(m1.Handle(), m2.Handle(), mout.Handle(), size, 1); },
                          [&](int, int32_t ret) {
@@ -245,14 +234,14 @@ TEST_F(ConvEntries, ArenaServesTheScratchAndItsExhaustionIsReported) {
   ErrorCluster ec{0, 0};
   ASSERT_EQ(InitializeAnalysisWorkspaceH(1 << 20, &ec), 0);
   ASSERT_EQ(EnableAnalysisWorkspaceH(&ec), 0);
-  const V a = Random(300, 8), b = Random(200, 9);
+  const V a = RandomReal(300, 8), b = RandomReal(200, 9);
   const V want = DirectConvolution(a, b);
   F64 x(a), y(b), out;
   int32_t err = 1, alg = 1;
   ASSERT_EQ(Convolution(x.Handle(), y.Handle(), out.Handle(), &alg, &err), 0);
   EXPECT_EQ(err, 0);
   for (size_t k = 0; k < want.size(); ++k) EXPECT_NEAR(out.At(static_cast<int32_t>(k)), want[k], 1e-12);
-  const V big = Random(100000, 10);
+  const V big = RandomReal(100000, 10);
   F64 bx(big), by(big);
   ASSERT_EQ(Convolution(bx.Handle(), by.Handle(), out.Handle(), &alg, &err), 0);
   EXPECT_EQ(err, TSM_ERR_NO_MEMORY);

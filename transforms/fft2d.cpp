@@ -12,17 +12,30 @@
 namespace tsm {
 namespace {
 
-// Transforms columns 0 .. ncols-1 of a rows x stride matrix in place.
+// Transforms columns 0 .. ncols-1 of a rows x stride matrix in place. The
+// columns go in blocks of kColumnBlock through a rows x block buffer, so
+// that the gather and the scatter read whole cache lines of each row.
+constexpr int32 kColumnBlock = 8;
+
 ErrorCode ColumnStage(const kwfft_table* planRows, cx* a, int32 rows, int32 stride, int32 ncols, bool inverse) {
-  HeapArray<cx> in, out;
-  if (in.Allocate(rows) != TSM_SUCCESS || out.Allocate(rows) != TSM_SUCCESS) return TSM_ERR_NO_MEMORY;
-  for (int32 c = 0; c < ncols; ++c) {
-    for (int32 r = 0; r < rows; ++r) in[r] = a[static_cast<std::int64_t>(r) * stride + c];
-    const ErrorCode e =
-        inverse ? kwfft_complex_inverse(planRows, &in[0].re, &in[0].im, &out[0].re, &out[0].im, 2, 2, rows)
-                : kwfft_complex(planRows, &in[0].re, &in[0].im, &out[0].re, &out[0].im, 2, 2, rows);
-    if (e != TSM_SUCCESS) return e;
-    for (int32 r = 0; r < rows; ++r) a[static_cast<std::int64_t>(r) * stride + c] = out[r];
+  HeapArray<cx> block, out;
+  if (block.Allocate(static_cast<std::int64_t>(rows) * kColumnBlock) != TSM_SUCCESS ||
+      out.Allocate(rows) != TSM_SUCCESS)
+    return TSM_ERR_NO_MEMORY;
+  for (int32 c0 = 0; c0 < ncols; c0 += kColumnBlock) {
+    const int32 b = std::min(kColumnBlock, ncols - c0);
+    for (int32 r = 0; r < rows; ++r) {
+      const cx* row = a + static_cast<std::int64_t>(r) * stride + c0;
+      std::copy(row, row + b, block.get() + static_cast<std::int64_t>(r) * b);
+    }
+    for (int32 j = 0; j < b; ++j) {
+      const cx* in = block.get() + j;
+      const ErrorCode e =
+          inverse ? kwfft_complex_inverse(planRows, &in->re, &in->im, &out[0].re, &out[0].im, 2 * b, 2, rows)
+                  : kwfft_complex(planRows, &in->re, &in->im, &out[0].re, &out[0].im, 2 * b, 2, rows);
+      if (e != TSM_SUCCESS) return e;
+      for (int32 r = 0; r < rows; ++r) a[static_cast<std::int64_t>(r) * stride + c0 + j] = out[r];
+    }
   }
   return TSM_SUCCESS;
 }

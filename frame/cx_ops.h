@@ -21,12 +21,4 @@ inline cx operator/(cx a, cx b) {
   const f64 q = 1.0 / Norm(b);
   return cx{(a.re * b.re + a.im * b.im) * q, (a.im * b.re - a.re * b.im) * q};
 }
-// z^p for a real exponent p, by the polar form (principal branch).
-inline cx CxPow(cx z, f64 p) {
-  if (p == 0.0) return cx{1.0, 0.0};
-  const f64 mag = std::pow(std::hypot(z.re, z.im), p);
-  const f64 ang = p * std::atan2(z.im, z.re);
-  return cx{mag * std::cos(ang), mag * std::sin(ang)};
-}
-
 }  // namespace tsm

@@ -2,8 +2,9 @@
 // Gohberg-Semencul form of the inverse Vandermonde matrix on the points W^k:
 // two products of triangular Toeplitz matrices, each a convolution.
 //
-// Every power is z^p from the polar form, so the phase error of W^(ik)
-// grows like i k |arg W| eps: the price of a spiral that need not close.
+// Every power is z^p from the polar form with the phase p arg z formed and
+// reduced modulo 2 pi in long double: p runs to 10^8 on long spirals, where
+// a float64 phase would lose eight digits.
 #include "transforms/chirpz.h"
 
 #include <algorithm>
@@ -16,6 +17,23 @@
 namespace tsm {
 namespace {
 
+constexpr long double kTwoPiL = 6.283185307179586476925286766559005768L;
+
+// z^p = |z|^p exp(i p arg z) on the principal branch, for real p.
+class PolarPower {
+ public:
+  explicit PolarPower(cx z) : logMag_(logl(hypotl(z.re, z.im))), arg_(atan2l(z.im, z.re)) {}
+  cx operator()(f64 p) const {
+    if (p == 0.0) return cx{1.0, 0.0};
+    const f64 phase = static_cast<f64>(remainderl(p * arg_, kTwoPiL));
+    const f64 mag = logMag_ == 0 ? 1.0 : static_cast<f64>(expl(p * logMag_));
+    return cx{mag * std::cos(phase), mag * std::sin(phase)};
+  }
+
+ private:
+  long double logMag_, arg_;
+};
+
 ErrorCode CheckSpiral(cx A, cx W) {
   if (!std::isfinite(A.re) || !std::isfinite(A.im) || !std::isfinite(W.re) || !std::isfinite(W.im))
     return TSM_ERR_NON_FINITE;
@@ -27,11 +45,12 @@ ErrorCode CheckSpiral(cx A, cx W) {
 ErrorCode Direct(const cx* x, int32 n, cx A, cx W, int32 M, cx* X) {
   HeapArray<cx> t;
   if (t.Allocate(n) != TSM_SUCCESS) return TSM_ERR_NO_MEMORY;
-  t[n - 1] = CxPow(A, 1.0 - n);
+  const PolarPower powW(W);
+  t[n - 1] = PolarPower(A)(1.0 - n);
   for (int32 i = n - 1; i > 0; --i) t[i - 1] = t[i] * A;
   for (int32 k = 0; k < M; ++k) {
     cx acc{0.0, 0.0};
-    for (int32 i = 0; i < n; ++i) acc += (x[i] * t[i]) * CxPow(W, static_cast<f64>(i) * k);
+    for (int32 i = 0; i < n; ++i) acc += (x[i] * t[i]) * powW(static_cast<f64>(i) * k);
     X[k] = acc;
   }
   return TSM_SUCCESS;
@@ -44,11 +63,12 @@ ErrorCode Bluestein(const cx* x, int32 n, cx A, cx W, int32 M, cx* X) {
   if (nc + n - 1 > 0x7FFFFFFF || c.Allocate(nc) != TSM_SUCCESS || a.Allocate(n) != TSM_SUCCESS ||
       conv.Allocate(nc + n - 1) != TSM_SUCCESS)
     return TSM_ERR_NO_MEMORY;
+  const PolarPower powW(W), powA(A);
   for (std::int64_t j = 0; j < nc; ++j) {
     const f64 d = static_cast<f64>(j - n);
-    c[j] = CxPow(W, -0.5 * d * d);
+    c[j] = powW(-0.5 * d * d);
   }
-  for (int32 i = 0; i < n; ++i) a[i] = (x[i] * CxPow(A, -static_cast<f64>(i))) / c[n - i];
+  for (int32 i = 0; i < n; ++i) a[i] = (x[i] * powA(-static_cast<f64>(i))) / c[n - i];
   const ErrorCode e = CxConvolve(a.get(), n, c.get(), static_cast<int32>(nc), conv.get(), kConvolveFft);
   if (e != TSM_SUCCESS) return e;
   for (int32 k = 0; k < M; ++k) X[k] = conv[n + k] / c[n + k];
@@ -97,20 +117,21 @@ ErrorCode InvChirpZ(const cx* X, int32 M, cx A, cx W, cx* x) {
       uhat.Allocate(M) != TSM_SUCCESS || t1.Allocate(M) != TSM_SUCCESS || t2.Allocate(M) != TSM_SUCCESS ||
       work.Allocate(3 * static_cast<std::int64_t>(M)) != TSM_SUCCESS)
     return TSM_ERR_NO_MEMORY;
+  const PolarPower powW(W), powA(A);
   for (int32 k = 0; k < M; ++k) {
     const f64 kk = k;
-    v[k] = X[k] * CxPow(W, -0.5 * kk * kk);
+    v[k] = X[k] * powW(-0.5 * kk * kk);
   }
   p[0] = cx{1.0, 0.0};
   for (int32 k = 1; k < M; ++k) {
-    const cx d = CxPow(W, k) - cx{1.0, 0.0};
+    const cx d = powW(k) - cx{1.0, 0.0};
     if (Norm(d) == 0.0) return TSM_ERR_ZERO_DIVISOR;
     p[k] = p[k - 1] * d;
   }
   const f64 m = M;
   for (int32 k = 0; k < M; ++k) {
     const f64 kk = k;
-    const cx w = CxPow(W, 0.5 * (2.0 * kk * kk - (2.0 * m - 1.0) * kk + m * (m - 1.0)));
+    const cx w = powW(0.5 * (2.0 * kk * kk - (2.0 * m - 1.0) * kk + m * (m - 1.0)));
     const cx q = w / (p[M - 1 - k] * p[k]);
     u[k] = (k % 2 == 0) ? q : cx{-q.re, -q.im};
   }
@@ -123,7 +144,7 @@ ErrorCode InvChirpZ(const cx* X, int32 M, cx A, cx W, cx* x) {
   if (e != TSM_SUCCESS) return e;
   for (int32 k = 0; k < M; ++k) {
     const f64 kk = k;
-    x[k] = ((t2[k] - t1[k]) / u[0]) * (CxPow(A, kk) * CxPow(W, -0.5 * kk * kk));
+    x[k] = ((t2[k] - t1[k]) / u[0]) * (powA(kk) * powW(-0.5 * kk * kk));
   }
   return TSM_SUCCESS;
 }

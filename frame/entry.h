@@ -87,4 +87,11 @@ ErrorCode FailB(ErrorCode code, Blocks**&... outputs) {
   return code;
 }
 
+// Form B: a negative kernel code empties the outputs and is returned; zero or
+// a warning is returned with the results in place.
+template <class... Blocks>
+ErrorCode ReportB(ErrorCode code, Blocks**&... outputs) {
+  return code < 0 ? FailB(code, outputs...) : code;
+}
+
 }  // namespace tsm

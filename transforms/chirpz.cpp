@@ -11,7 +11,7 @@
 #include <cmath>
 
 #include "frame/cx_ops.h"
-#include "frame/heap_array.h"
+#include "frame/heap_scratch.h"
 #include "timedomain/convolution.h"
 
 namespace tsm {
@@ -43,7 +43,7 @@ ErrorCode CheckSpiral(cx A, cx W) {
 
 // t[i] = A^-i, from A^(1-n) at the top multiplied by A downwards.
 ErrorCode Direct(const cx* x, int32 n, cx A, cx W, int32 M, cx* X) {
-  HeapArray<cx> t;
+  HeapScratch<cx> t;
   if (t.Allocate(n) != TSM_SUCCESS) return TSM_ERR_NO_MEMORY;
   const PolarPower powW(W);
   t[n - 1] = PolarPower(A)(1.0 - n);
@@ -59,7 +59,7 @@ ErrorCode Direct(const cx* x, int32 n, cx A, cx W, int32 M, cx* X) {
 // c[j] = W^(-(j-n)^2 / 2); a[i] = x[i] A^-i / c[n-i]; X[k] = (a * c)[n+k] / c[n+k].
 ErrorCode Bluestein(const cx* x, int32 n, cx A, cx W, int32 M, cx* X) {
   const std::int64_t nc = static_cast<std::int64_t>(n) + M;
-  HeapArray<cx> c, a, conv;
+  HeapScratch<cx> c, a, conv;
   if (nc + n - 1 > 0x7FFFFFFF || c.Allocate(nc) != TSM_SUCCESS || a.Allocate(n) != TSM_SUCCESS ||
       conv.Allocate(nc + n - 1) != TSM_SUCCESS)
     return TSM_ERR_NO_MEMORY;
@@ -78,7 +78,7 @@ ErrorCode Bluestein(const cx* x, int32 n, cx A, cx W, int32 M, cx* X) {
 template <class T>
 ErrorCode ChirpZAny(const T* x, int32 n, cx A, cx W, int32 M, int32 method, cx* X) {
   if (const ErrorCode e = CheckSpiral(A, W); e != TSM_SUCCESS) return e;
-  HeapArray<cx> z;
+  HeapScratch<cx> z;
   if (z.Allocate(n) != TSM_SUCCESS) return TSM_ERR_NO_MEMORY;
   for (int32 i = 0; i < n; ++i) z[i] = AsCx(x[i]);
   return method == kChirpZDirect ? Direct(z.get(), n, A, W, M, X) : Bluestein(z.get(), n, A, W, M, X);
@@ -112,7 +112,7 @@ ErrorCode CxChirpZ(const cx* x, int32 n, cx A, cx W, int32 M, int32 method, cx* 
 // sequence; then x[k] = A^k W^(-k^2/2) times that.
 ErrorCode InvChirpZ(const cx* X, int32 M, cx A, cx W, cx* x) {
   if (const ErrorCode e = CheckSpiral(A, W); e != TSM_SUCCESS) return e;
-  HeapArray<cx> v, p, u, uhat, t1, t2, work;
+  HeapScratch<cx> v, p, u, uhat, t1, t2, work;
   if (v.Allocate(M) != TSM_SUCCESS || p.Allocate(M) != TSM_SUCCESS || u.Allocate(M) != TSM_SUCCESS ||
       uhat.Allocate(M) != TSM_SUCCESS || t1.Allocate(M) != TSM_SUCCESS || t2.Allocate(M) != TSM_SUCCESS ||
       work.Allocate(3 * static_cast<std::int64_t>(M)) != TSM_SUCCESS)

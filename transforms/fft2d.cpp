@@ -6,7 +6,7 @@
 #include <cstring>
 
 #include "frame/cx_ops.h"
-#include "frame/heap_array.h"
+#include "frame/heap_scratch.h"
 #include "transforms/kwfft.h"
 
 namespace tsm {
@@ -18,7 +18,7 @@ namespace {
 constexpr int32 kColumnBlock = 8;
 
 ErrorCode ColumnStage(const kwfft_table* planRows, cx* a, int32 rows, int32 stride, int32 ncols, bool inverse) {
-  HeapArray<cx> block, out;
+  HeapScratch<cx> block, out;
   if (block.Allocate(static_cast<std::int64_t>(rows) * kColumnBlock) != TSM_SUCCESS ||
       out.Allocate(rows) != TSM_SUCCESS)
     return TSM_ERR_NO_MEMORY;
@@ -76,8 +76,8 @@ ErrorCode ReFft2D(const kwfft_table* planCols, const kwfft_table* planRows, cons
     return TSM_SUCCESS;
   }
   const int32 half = cols / 2 + 1;
-  HeapArray<cx> H;
-  HeapArray<f64> pad, hc;
+  HeapScratch<cx> H;
+  HeapScratch<f64> pad, hc;
   if (H.Allocate(static_cast<std::int64_t>(rows) * half) != TSM_SUCCESS || pad.Allocate(cols) != TSM_SUCCESS ||
       hc.Allocate(cols) != TSM_SUCCESS)
     return TSM_ERR_NO_MEMORY;
@@ -110,7 +110,7 @@ ErrorCode CxFft2D(const kwfft_table* planCols, const kwfft_table* planRows, cons
     X[0] = x[static_cast<std::int64_t>(rowOffset) * inCols + colOffset];
     return TSM_SUCCESS;
   }
-  HeapArray<cx> pad;
+  HeapScratch<cx> pad;
   if (pad.Allocate(cols) != TSM_SUCCESS) return TSM_ERR_NO_MEMORY;
   std::fill(X, X + static_cast<std::int64_t>(rows) * cols, cx{0.0, 0.0});
   for (int32 r = 0; r < rows; ++r) {
@@ -130,7 +130,7 @@ namespace {
 // The spectrum in heap scratch, unshifted, with the inverse column stage run
 // over its first ncols columns.
 ErrorCode InverseColumns(const kwfft_table* planRows, const cx* X, int32 rows, int32 cols, int32 shift,
-                         int32 ncols, HeapArray<cx>* S) {
+                         int32 ncols, HeapScratch<cx>* S) {
   const std::int64_t total = static_cast<std::int64_t>(rows) * cols;
   if (S->Allocate(total) != TSM_SUCCESS) return TSM_ERR_NO_MEMORY;
   std::copy(X, X + total, S->get());
@@ -142,8 +142,8 @@ ErrorCode InverseColumns(const kwfft_table* planRows, const cx* X, int32 rows, i
 
 ErrorCode ReInvFft2D(const kwfft_table* planCols, const kwfft_table* planRows, const cx* X, int32 rows,
                      int32 cols, int32 shift, f64* x) {
-  HeapArray<cx> S;
-  HeapArray<f64> hc;
+  HeapScratch<cx> S;
+  HeapScratch<f64> hc;
   if (hc.Allocate(cols) != TSM_SUCCESS) return TSM_ERR_NO_MEMORY;
   if (const ErrorCode e = InverseColumns(planRows, X, rows, cols, shift, cols / 2 + 1, &S); e != TSM_SUCCESS)
     return e;
@@ -157,7 +157,7 @@ ErrorCode ReInvFft2D(const kwfft_table* planCols, const kwfft_table* planRows, c
 
 ErrorCode CxInvFft2D(const kwfft_table* planCols, const kwfft_table* planRows, const cx* X, int32 rows,
                      int32 cols, int32 shift, cx* x) {
-  HeapArray<cx> S;
+  HeapScratch<cx> S;
   if (const ErrorCode e = InverseColumns(planRows, X, rows, cols, shift, cols, &S); e != TSM_SUCCESS) return e;
   for (int32 r = 0; r < rows; ++r) {
     const cx* in = S.get() + static_cast<std::int64_t>(r) * cols;

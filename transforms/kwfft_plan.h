@@ -13,6 +13,7 @@
 #pragma once
 
 #include <cstddef>
+#include <memory>
 
 #include "frame/types.h"
 
@@ -67,6 +68,11 @@ namespace tsm {
 kwfft_table* CreateKwfftTable(int32 n);
 // Drops one reference; the last one frees the plan. Null is a no-op.
 void DestroyKwfftTable(kwfft_table* plan);
+// One reference to a cached plan, dropped at the end of its scope.
+struct KwfftTableRelease {
+  void operator()(kwfft_table* plan) const { DestroyKwfftTable(plan); }
+};
+using KwfftTableReference = std::unique_ptr<kwfft_table, KwfftTableRelease>;
 // The same without the mutex, for nested plans built under it.
 kwfft_table* kwfft_table_create_locked(int32 n);
 void kwfft_table_destroy_locked(kwfft_table* plan);

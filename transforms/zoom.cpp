@@ -4,7 +4,7 @@
 #include <cmath>
 
 #include "frame/cx_ops.h"
-#include "frame/heap_array.h"
+#include "frame/heap_scratch.h"
 #include "transforms/kwfft.h"
 
 namespace tsm {
@@ -23,7 +23,7 @@ void Gather(const T* x, int32 n, int32 r, int32 a, int32 m, T* s) {
 struct RealPhase {
   const kwfft_table* plan;
   int32 m;
-  HeapArray<f64> s, h;
+  HeapScratch<f64> s, h;
   ErrorCode Allocate() { return s.Allocate(m) == TSM_SUCCESS ? h.Allocate(m) : TSM_ERR_NO_MEMORY; }
   ErrorCode Transform(const f64* x, int32 n, int32 r, int32 a) {
     Gather(x, n, r, a, m, s.get());
@@ -39,7 +39,7 @@ struct RealPhase {
 struct ComplexPhase {
   const kwfft_table* plan;
   int32 m;
-  HeapArray<cx> s, S;
+  HeapScratch<cx> s, S;
   ErrorCode Allocate() { return s.Allocate(m) == TSM_SUCCESS ? S.Allocate(m) : TSM_ERR_NO_MEMORY; }
   ErrorCode Transform(const cx* x, int32 n, int32 r, int32 a) {
     Gather(x, n, r, a, m, s.get());

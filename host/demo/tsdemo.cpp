@@ -69,6 +69,22 @@ std::vector<double> Readings() {
   return x;
 }
 
+// Magnitudes |X[k]| * 2 / n of the real FFT of x (bins 0 .. n/2).
+std::vector<double> Magnitudes(F64ArrayHdl x, int n) {
+  auto X = static_cast<CxArrayHdl>(tsrt_new_array(TSM_TYPE_CX128, 0, nullptr));
+  PlanHolder* state = nullptr;
+  ENTRY(ReKWFFTH80)(x, X, &state, 0, n, 0);
+  std::vector<double> m(n / 2 + 1);
+  for (int k = 0; k <= n / 2; ++k) {
+    double re, im;
+    std::memcpy(&re, reinterpret_cast<char*>(*X) + 4 + 16 * k, 8);
+    std::memcpy(&im, reinterpret_cast<char*>(*X) + 12 + 16 * k, 8);
+    m[k] = std::hypot(re, im) * 2 / n;
+  }
+  tsrt_dispose(X);
+  return m;
+}
+
 // Three tones (50, 120 and 333 Hz at 1 kHz sampling, amplitudes 1, 0.5 and
 // 0.25) over 1000 samples: the strongest bins of the real FFT.
 void Spectrum() {
@@ -80,23 +96,40 @@ void Spectrum() {
                0.25 * std::cos(2 * M_PI * 333 * t);
   }
   F64ArrayHdl x = NewArray<F64Array>(TSM_TYPE_F64, tones);
-  auto X = static_cast<CxArrayHdl>(tsrt_new_array(TSM_TYPE_CX128, 0, nullptr));
-  PlanHolder* state = nullptr;
-  const int32_t code = ENTRY(ReKWFFTH80)(x, X, &state, 0, n, 0);
-  std::printf("  spectrum of three tones (ReKWFFTH80, %d bins, code %d), strongest bins:\n", CountOf(X), code);
+  const std::vector<double> m = Magnitudes(x, n);
+  std::printf("  spectrum of three tones (ReKWFFTH80, %d bins), strongest bins:\n", n / 2 + 1);
   std::vector<std::pair<double, int>> bins;
-  for (int k = 0; k <= n / 2; ++k) {
-    double re, im;
-    std::memcpy(&re, reinterpret_cast<char*>(*X) + 4 + 16 * k, 8);
-    std::memcpy(&im, reinterpret_cast<char*>(*X) + 12 + 16 * k, 8);
-    bins.push_back({std::hypot(re, im) * 2 / n, k});
-  }
+  for (int k = 0; k <= n / 2; ++k) bins.push_back({m[k], k});
   std::sort(bins.begin(), bins.end(), std::greater<>());
   for (int i = 0; i < 4; ++i)
     std::printf("    %4d Hz  amplitude %.12f\n", bins[i].second, bins[i].first);
   std::printf("\n");
   tsrt_dispose(x);
-  tsrt_dispose(X);
+}
+
+// Leakage: a strong tone between two bins (100.5 Hz, amplitude 1) and a weak
+// one 80 dB below it (140 Hz), 1024 samples at 1024 Hz. Without a window the
+// strong tone's leakage buries the weak one; a four-term Blackman-Harris
+// window, scaled to unit coherent gain, brings it out.
+void Windowing() {
+  const int n = 1024;
+  std::vector<double> tones(n);
+  for (int i = 0; i < n; ++i)
+    tones[i] = std::sin(2 * M_PI * 100.5 * i / n) + 1e-4 * std::sin(2 * M_PI * 140.0 * i / n);
+  F64ArrayHdl plain = NewArray<F64Array>(TSM_TYPE_F64, tones);
+  F64ArrayHdl windowed = NewArray<F64Array>(TSM_TYPE_F64, tones);
+  WinConsts consts{};
+  const int32_t code = ENTRY(ScaledWinH)(windowed, 7, 0.0, &consts);
+  std::printf("  two tones, 100.5 Hz at 0 dB and 140 Hz at -80 dB; four-term Blackman-Harris window\n"
+              "  (ScaledWinH code %d, coherent gain %.6f, noise bandwidth %.6f bins):\n",
+              code, consts.cg, consts.enbw);
+  const std::vector<double> a = Magnitudes(plain, n), b = Magnitudes(windowed, n);
+  std::printf("    bin      no window   windowed  (dB)\n");
+  for (int k : {100, 101, 110, 120, 130, 138, 139, 140, 141, 142, 160})
+    std::printf("    %4d Hz  %9.1f  %9.1f\n", k, 20 * std::log10(a[k]), 20 * std::log10(b[k]));
+  std::printf("\n");
+  tsrt_dispose(plain);
+  tsrt_dispose(windowed);
 }
 
 }  // namespace
@@ -196,6 +229,7 @@ int main(int argc, char** argv) {
     tsrt_dispose(h);
 
   Spectrum();
+  Windowing();
 
   ENTRY(DisableAnalysisWorkspaceH)(&err);
   ENTRY(UninitializeAnalysisWorkspaceH)(&err);

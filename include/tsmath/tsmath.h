@@ -60,6 +60,10 @@ typedef struct ErrorCluster { uint8_t status; int32_t code; } ErrorCluster;
  * takes every sample as inside. */
 typedef struct GenHistInterval { double lower; double upper; int32_t inclusion; } GenHistInterval;
 typedef struct GenHistIntervalArray { int32_t count; GenHistInterval elt[1]; } GenHistIntervalArray;
+
+/* Constants of a window: equivalent noise bandwidth in bins, then coherent
+ * gain (the window's mean). */
+typedef struct WinConsts { double enbw; double cg; } WinConsts;
 #pragma pack(pop)
 
 /* Samples of the general histogram that fell in no interval (total), below the

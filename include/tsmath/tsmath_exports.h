@@ -1,6 +1,6 @@
 /* Automatically generated from entries/exports.table, do not edit.
  * Regenerate: cmake -P tools/gen_exports.cmake
- * 62 exports. Included by tsmath.h inside its extern "C" block. */
+ * 151 exports. Included by tsmath.h inside its extern "C" block. */
 #ifndef TSMATH_EXPORTS_H
 #define TSMATH_EXPORTS_H
 
@@ -15,6 +15,26 @@ TSM_API void SetTSRTModule(void* module);
 TSM_API void SetTSRTTLSIndex(int32_t index);
 TSM_API void SetTSRTModuleHook(void* module);
 TSM_API void SetTSRTTLSIndexHook(int32_t index);
+
+/* Waveform generators */
+TSM_API int32_t SineWaveCIN(F64ArrayHdl out, int32_t* n, double* amp, double* freq, double* phase, int32_t* err);
+TSM_API int32_t SquareWaveCIN(F64ArrayHdl out, int32_t* n, double* amp, double* freq, double* phase, double* duty, int32_t* err);
+TSM_API int32_t SawtoothWaveCIN(F64ArrayHdl out, int32_t* n, double* amp, double* freq, double* phase, int32_t* err);
+TSM_API int32_t TriangleWaveCIN(F64ArrayHdl out, int32_t* n, double* amp, double* freq, double* phase, int32_t* err);
+TSM_API int32_t ArbitraryWaveCIN(F64ArrayHdl out, int32_t* n, double* amp, double* freq, double* phase, F64ArrayHdl table, int32_t* interp, int32_t* err);
+TSM_API int32_t ChirpCIN(F64ArrayHdl out, int32_t* n, double* amp, double* f1, double* f2, int32_t* err);
+TSM_API int32_t SinePtrn(F64ArrayHdl out, int32_t* n, double* amp, double* phase, double* cycles, int32_t* err);
+TSM_API int32_t Square(F64ArrayHdl out, int32_t* n, double* amp, double* duty, double* cycles, int32_t* err);
+TSM_API int32_t RampPtrn(F64ArrayHdl out, int32_t* n, double* start, double* end, int32_t* err);
+TSM_API int32_t ImpulsePtrn(F64ArrayHdl out, int32_t* n, double* amp, int32_t* delay, int32_t* err);
+TSM_API int32_t PulsePtrn(F64ArrayHdl out, int32_t* n, double* amp, int32_t* delay, int32_t* width, int32_t* err);
+TSM_API int32_t SincWave(F64ArrayHdl out, int32_t* n, double* amp, double* delay, double* dt, int32_t* err);
+TSM_API int32_t RampPtrn85(F64ArrayHdl out, int32_t n, double start, double end, int32_t mode, uint32_t scale);
+TSM_API int32_t RampPtrn80(F64ArrayHdl out, int32_t n, double start, double end, int32_t mode);
+TSM_API int32_t AperiodTriangleH(F64ArrayHdl xy, int32_t n, double amp, double delay, double dt, double width, double skew);
+TSM_API int32_t GaussMonopulseH(F64ArrayHdl xy, int32_t n, double dt, double delay, double fc, double amp);
+TSM_API int32_t GaussPulseH(F64ArrayHdl xy, int32_t n, double amp, double delay, double dt, double fc, double bw, double att);
+TSM_API int32_t PeriodicSincH(F64ArrayHdl xy, int32_t n, double amp, int32_t order, double dt, double delay);
 
 /* Descriptive statistics */
 TSM_API int32_t Mean_head(F64ArrayHdl x, double* mean, int32_t* err);
@@ -77,5 +97,82 @@ TSM_API int32_t ReInvFFT2D_H(CxMatrixHdl X, int32_t shift, MatrixHdl x, PlanHold
 TSM_API int32_t ReInvFFT2D_H_IDP(CxMatrixHdl X, int32_t shift, MatrixHdl x, ReservedTransformState** state);
 TSM_API int32_t CxInvFFT2D_H(CxMatrixHdl X, int32_t shift, CxMatrixHdl x, PlanHolder** stateCols, PlanHolder** stateRows);
 TSM_API int32_t CxInvFFT2D_H_IDP(CxMatrixHdl X, int32_t shift, CxMatrixHdl x, ReservedTransformState** state);
+
+/* Spectra and Hilbert */
+TSM_API int32_t SpectrumH(F64ArrayHdl x, PlanHolder** state);
+TSM_API int32_t SpectrumH_IDP(F64ArrayHdl x, ReservedTransformState** state);
+TSM_API int32_t CxSpectrumH(CxArrayHdl x, F64ArrayHdl s, PlanHolder** state);
+TSM_API int32_t CxSpectrumH_IDP(CxArrayHdl x, F64ArrayHdl s, ReservedTransformState** state);
+TSM_API int32_t CrossSpectrumH(F64ArrayHdl x, F64ArrayHdl y, CxArrayHdl S, PlanHolder** state);
+TSM_API int32_t CrossSpectrumH_IDP(F64ArrayHdl x, F64ArrayHdl y, CxArrayHdl S, ReservedTransformState** state);
+TSM_API int32_t CxCrossSpectrumH(CxArrayHdl x, CxArrayHdl y, CxArrayHdl S, PlanHolder** state);
+TSM_API int32_t CxCrossSpectrumH_IDP(CxArrayHdl x, CxArrayHdl y, CxArrayHdl S, ReservedTransformState** state);
+TSM_API int32_t FastHilbertTransformH(F64ArrayHdl x, PlanHolder** state);
+TSM_API int32_t FastHilbertTransformH_IDP(F64ArrayHdl x, ReservedTransformState** state);
+TSM_API int32_t InvFastHilbertTransformH(F64ArrayHdl x, PlanHolder** state);
+TSM_API int32_t InvFastHilbertTransformH_IDP(F64ArrayHdl x, ReservedTransformState** state);
+TSM_API int32_t FHTH(F64ArrayHdl x, PlanHolder** state);
+TSM_API int32_t FHTH_IDP(F64ArrayHdl x, ReservedTransformState** state);
+TSM_API int32_t InvFHTH(F64ArrayHdl x, PlanHolder** state);
+TSM_API int32_t InvFHTH_IDP(F64ArrayHdl x, ReservedTransformState** state);
+
+/* DCT and DST */
+TSM_API int32_t DCT_1DH(F64ArrayHdl x, F64ArrayHdl y, int32_t size, PlanHolder** state);
+TSM_API int32_t DCT_1DH_IDP(F64ArrayHdl x, F64ArrayHdl y, int32_t size, ReservedTransformState** state);
+TSM_API int32_t DST_1DH(F64ArrayHdl x, F64ArrayHdl y, int32_t size, PlanHolder** state);
+TSM_API int32_t DST_1DH_IDP(F64ArrayHdl x, F64ArrayHdl y, int32_t size, ReservedTransformState** state);
+TSM_API int32_t InvDCT_1DH(F64ArrayHdl y, F64ArrayHdl x, PlanHolder** state);
+TSM_API int32_t InvDCT_1DH_IDP(F64ArrayHdl y, F64ArrayHdl x, ReservedTransformState** state);
+TSM_API int32_t InvDST_1DH(F64ArrayHdl y, F64ArrayHdl x, PlanHolder** state);
+TSM_API int32_t InvDST_1DH_IDP(F64ArrayHdl y, F64ArrayHdl x, ReservedTransformState** state);
+TSM_API int32_t DCT_2DH(MatrixHdl x, MatrixHdl y, int32_t rows, int32_t cols, PlanHolder** stateRows, PlanHolder** stateCols);
+TSM_API int32_t DCT_2DH_IDP(MatrixHdl x, MatrixHdl y, int32_t rows, int32_t cols, ReservedTransformState** state);
+TSM_API int32_t DST_2DH(MatrixHdl x, MatrixHdl y, int32_t rows, int32_t cols, PlanHolder** stateRows, PlanHolder** stateCols);
+TSM_API int32_t DST_2DH_IDP(MatrixHdl x, MatrixHdl y, int32_t rows, int32_t cols, ReservedTransformState** state);
+TSM_API int32_t InvDCT_2DH(MatrixHdl y, MatrixHdl x, PlanHolder** stateRows, PlanHolder** stateCols);
+TSM_API int32_t InvDCT_2DH_IDP(MatrixHdl y, MatrixHdl x, ReservedTransformState** state);
+TSM_API int32_t InvDST_2DH(MatrixHdl y, MatrixHdl x, PlanHolder** stateRows, PlanHolder** stateCols);
+TSM_API int32_t InvDST_2DH_IDP(MatrixHdl y, MatrixHdl x, ReservedTransformState** state);
+
+/* Windows */
+TSM_API int32_t AllCosWinH(F64ArrayHdl x, int32_t selector, int32_t normalise);
+TSM_API int32_t CxAllCosWinH(CxArrayHdl x, int32_t selector, int32_t normalise);
+TSM_API int32_t GenCosWinH(F64ArrayHdl x, F64ArrayHdl coefs);
+TSM_API int32_t CxGenCosWinH(CxArrayHdl x, F64ArrayHdl coefs);
+TSM_API int32_t ScaledGenCosWinH(F64ArrayHdl x, F64ArrayHdl coefs);
+TSM_API int32_t ScaledCxGenCosWinH(CxArrayHdl x, F64ArrayHdl coefs);
+TSM_API int32_t BartHannWinH(F64ArrayHdl x);
+TSM_API int32_t CxBartHannWinH(CxArrayHdl x);
+TSM_API int32_t BohmanWinH(F64ArrayHdl x);
+TSM_API int32_t CxBohmanWinH(CxArrayHdl x);
+TSM_API int32_t ParzenWinH(F64ArrayHdl x);
+TSM_API int32_t CxParzenWinH(CxArrayHdl x);
+TSM_API int32_t WelchWinH(F64ArrayHdl x);
+TSM_API int32_t CxWelchWinH(CxArrayHdl x);
+TSM_API int32_t TriangleWinH(F64ArrayHdl x);
+TSM_API int32_t CxTriangleWinH(CxArrayHdl x);
+TSM_API int32_t TriangleWin(F64ArrayHdl x, int32_t* err);
+TSM_API int32_t CosTaperedH(F64ArrayHdl x, double ratio);
+TSM_API int32_t CxCosTaperedH(CxArrayHdl x, double ratio);
+TSM_API int32_t CosTapered(F64ArrayHdl x, int32_t* err);
+TSM_API int32_t DolChebyWinH(F64ArrayHdl x, double ratio, int32_t form);
+TSM_API int32_t CxDolChebyWinH(CxArrayHdl x, double ratio, int32_t form);
+TSM_API int32_t ExpWinH(F64ArrayHdl x, double final_value);
+TSM_API int32_t CxExpWinH(CxArrayHdl x, double final_value);
+TSM_API int32_t ExpWindCIN(F64ArrayHdl x, double* final_value, int32_t* err);
+TSM_API int32_t ForceWinH(F64ArrayHdl x, double duty);
+TSM_API int32_t CxForceWinH(CxArrayHdl x, double duty);
+TSM_API int32_t ForceWindCIN(F64ArrayHdl x, double* duty, int32_t* err);
+TSM_API int32_t GaussWinH(F64ArrayHdl x, double sigma, int32_t form);
+TSM_API int32_t CxGaussWinH(CxArrayHdl x, double sigma, int32_t form);
+TSM_API int32_t KaiserH(F64ArrayHdl x, double beta);
+TSM_API int32_t CxKaiserH(CxArrayHdl x, double beta);
+TSM_API int32_t Kaiser_Bessel(F64ArrayHdl x, double* beta, int32_t* err);
+TSM_API int32_t ScaledWinH(F64ArrayHdl x, int32_t selector, double param, WinConsts* consts);
+TSM_API int32_t CxScaledWinH(CxArrayHdl x, int32_t selector, double param, WinConsts* consts);
+TSM_API int32_t SymmWinH(F64ArrayHdl x, int32_t selector, double param);
+TSM_API int32_t CxSymmWinH(CxArrayHdl x, int32_t selector, double param);
+TSM_API int32_t WinConstByNameH(int32_t n, int32_t selector, double param, WinConsts* consts);
+TSM_API int32_t NumWinConstH(F64ArrayHdl w, WinConsts* consts);
 
 #endif

@@ -10,12 +10,12 @@
 namespace tsm {
 
 template <class T>
-class HeapArray {
+class HeapScratch {
  public:
-  HeapArray() = default;
-  HeapArray(const HeapArray&) = delete;
-  HeapArray& operator=(const HeapArray&) = delete;
-  ~HeapArray() { std::free(p_); }
+  HeapScratch() = default;
+  HeapScratch(const HeapScratch&) = delete;
+  HeapScratch& operator=(const HeapScratch&) = delete;
+  ~HeapScratch() { std::free(p_); }
   // -20001 when the heap refuses or the size does not fit a size_t.
   ErrorCode Allocate(std::int64_t n) {
     std::free(p_);

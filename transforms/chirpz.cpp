@@ -11,7 +11,7 @@
 #include <cmath>
 
 #include "frame/cx_ops.h"
-#include "frame/heap_scratch.h"
+#include "frame/heap.h"
 #include "timedomain/convolution.h"
 
 namespace tsm {
@@ -44,7 +44,7 @@ ErrorCode CheckSpiral(cx A, cx W) {
 // t[i] = A^-i, from A^(1-n) at the top multiplied by A downwards.
 ErrorCode Direct(const cx* x, int32 n, cx A, cx W, int32 M, cx* X) {
   HeapScratch<cx> t;
-  if (t.Allocate(n) != TSM_SUCCESS) return TSM_ERR_NO_MEMORY;
+  if (!t.Allocate(n)) return TSM_ERR_NO_MEMORY;
   const PolarPower powW(W);
   t[n - 1] = PolarPower(A)(1.0 - n);
   for (int32 i = n - 1; i > 0; --i) t[i - 1] = t[i] * A;
@@ -60,8 +60,8 @@ ErrorCode Direct(const cx* x, int32 n, cx A, cx W, int32 M, cx* X) {
 ErrorCode Bluestein(const cx* x, int32 n, cx A, cx W, int32 M, cx* X) {
   const std::int64_t nc = static_cast<std::int64_t>(n) + M;
   HeapScratch<cx> c, a, conv;
-  if (nc + n - 1 > 0x7FFFFFFF || c.Allocate(nc) != TSM_SUCCESS || a.Allocate(n) != TSM_SUCCESS ||
-      conv.Allocate(nc + n - 1) != TSM_SUCCESS)
+  if (nc + n - 1 > 0x7FFFFFFF || !c.Allocate(nc) || !a.Allocate(n) ||
+      !conv.Allocate(nc + n - 1))
     return TSM_ERR_NO_MEMORY;
   const PolarPower powW(W), powA(A);
   for (std::int64_t j = 0; j < nc; ++j) {
@@ -79,7 +79,7 @@ template <class T>
 ErrorCode ChirpZAny(const T* x, int32 n, cx A, cx W, int32 M, int32 method, cx* X) {
   if (const ErrorCode e = CheckSpiral(A, W); e != TSM_SUCCESS) return e;
   HeapScratch<cx> z;
-  if (z.Allocate(n) != TSM_SUCCESS) return TSM_ERR_NO_MEMORY;
+  if (!z.Allocate(n)) return TSM_ERR_NO_MEMORY;
   for (int32 i = 0; i < n; ++i) z[i] = AsCx(x[i]);
   return method == kChirpZDirect ? Direct(z.get(), n, A, W, M, X) : Bluestein(z.get(), n, A, W, M, X);
 }
@@ -113,9 +113,9 @@ ErrorCode CxChirpZ(const cx* x, int32 n, cx A, cx W, int32 M, int32 method, cx* 
 ErrorCode InvChirpZ(const cx* X, int32 M, cx A, cx W, cx* x) {
   if (const ErrorCode e = CheckSpiral(A, W); e != TSM_SUCCESS) return e;
   HeapScratch<cx> v, p, u, uhat, t1, t2, work;
-  if (v.Allocate(M) != TSM_SUCCESS || p.Allocate(M) != TSM_SUCCESS || u.Allocate(M) != TSM_SUCCESS ||
-      uhat.Allocate(M) != TSM_SUCCESS || t1.Allocate(M) != TSM_SUCCESS || t2.Allocate(M) != TSM_SUCCESS ||
-      work.Allocate(3 * static_cast<std::int64_t>(M)) != TSM_SUCCESS)
+  if (!v.Allocate(M) || !p.Allocate(M) || !u.Allocate(M) ||
+      !uhat.Allocate(M) || !t1.Allocate(M) || !t2.Allocate(M) ||
+      !work.Allocate(3 * static_cast<std::int64_t>(M)))
     return TSM_ERR_NO_MEMORY;
   const PolarPower powW(W), powA(A);
   for (int32 k = 0; k < M; ++k) {

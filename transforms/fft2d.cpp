@@ -6,7 +6,7 @@
 #include <cstring>
 
 #include "frame/cx_ops.h"
-#include "frame/heap_scratch.h"
+#include "frame/heap.h"
 #include "transforms/kwfft.h"
 
 namespace tsm {
@@ -19,8 +19,8 @@ constexpr int32 kColumnBlock = 8;
 
 ErrorCode ColumnStage(const kwfft_table* planRows, cx* a, int32 rows, int32 stride, int32 ncols, bool inverse) {
   HeapScratch<cx> block, out;
-  if (block.Allocate(static_cast<std::int64_t>(rows) * kColumnBlock) != TSM_SUCCESS ||
-      out.Allocate(rows) != TSM_SUCCESS)
+  if (!block.Allocate(static_cast<std::int64_t>(rows) * kColumnBlock) ||
+      !out.Allocate(rows))
     return TSM_ERR_NO_MEMORY;
   for (int32 c0 = 0; c0 < ncols; c0 += kColumnBlock) {
     const int32 b = std::min(kColumnBlock, ncols - c0);
@@ -78,9 +78,10 @@ ErrorCode ReFft2D(const kwfft_table* planCols, const kwfft_table* planRows, cons
   const int32 half = cols / 2 + 1;
   HeapScratch<cx> H;
   HeapScratch<f64> pad, hc;
-  if (H.Allocate(static_cast<std::int64_t>(rows) * half) != TSM_SUCCESS || pad.Allocate(cols) != TSM_SUCCESS ||
-      hc.Allocate(cols) != TSM_SUCCESS)
+  if (!H.Allocate(static_cast<std::int64_t>(rows) * half) || !pad.Allocate(cols) ||
+      !hc.Allocate(cols))
     return TSM_ERR_NO_MEMORY;
+  std::fill(H.get(), H.get() + static_cast<std::int64_t>(rows) * half, cx{0.0, 0.0});  // rows past the input
   for (int32 r = 0; r < rows; ++r) {
     const f64* src = WindowRow(x, inRows, inCols, rowOffset, colOffset, r, cols, pad.get());
     if (src == nullptr) break;
@@ -111,7 +112,7 @@ ErrorCode CxFft2D(const kwfft_table* planCols, const kwfft_table* planRows, cons
     return TSM_SUCCESS;
   }
   HeapScratch<cx> pad;
-  if (pad.Allocate(cols) != TSM_SUCCESS) return TSM_ERR_NO_MEMORY;
+  if (!pad.Allocate(cols)) return TSM_ERR_NO_MEMORY;
   std::fill(X, X + static_cast<std::int64_t>(rows) * cols, cx{0.0, 0.0});
   for (int32 r = 0; r < rows; ++r) {
     const cx* src = WindowRow(x, inRows, inCols, rowOffset, colOffset, r, cols, pad.get());
@@ -132,7 +133,7 @@ namespace {
 ErrorCode InverseColumns(const kwfft_table* planRows, const cx* X, int32 rows, int32 cols, int32 shift,
                          int32 ncols, HeapScratch<cx>* S) {
   const std::int64_t total = static_cast<std::int64_t>(rows) * cols;
-  if (S->Allocate(total) != TSM_SUCCESS) return TSM_ERR_NO_MEMORY;
+  if (!S->Allocate(total)) return TSM_ERR_NO_MEMORY;
   std::copy(X, X + total, S->get());
   if (shift != 0) Shift2D(S->get(), rows, cols, true);
   return ColumnStage(planRows, S->get(), rows, cols, ncols, true);
@@ -144,7 +145,7 @@ ErrorCode ReInvFft2D(const kwfft_table* planCols, const kwfft_table* planRows, c
                      int32 cols, int32 shift, f64* x) {
   HeapScratch<cx> S;
   HeapScratch<f64> hc;
-  if (hc.Allocate(cols) != TSM_SUCCESS) return TSM_ERR_NO_MEMORY;
+  if (!hc.Allocate(cols)) return TSM_ERR_NO_MEMORY;
   if (const ErrorCode e = InverseColumns(planRows, X, rows, cols, shift, cols / 2 + 1, &S); e != TSM_SUCCESS)
     return e;
   for (int32 r = 0; r < rows; ++r) {

@@ -4,7 +4,7 @@
 #include <cmath>
 
 #include "frame/cx_ops.h"
-#include "frame/heap_scratch.h"
+#include "frame/heap.h"
 #include "transforms/kwfft.h"
 
 namespace tsm {
@@ -24,7 +24,7 @@ struct RealPhase {
   const kwfft_table* plan;
   int32 m;
   HeapScratch<f64> s, h;
-  ErrorCode Allocate() { return s.Allocate(m) == TSM_SUCCESS ? h.Allocate(m) : TSM_ERR_NO_MEMORY; }
+  bool Allocate() { return s.Allocate(m) && h.Allocate(m); }
   ErrorCode Transform(const f64* x, int32 n, int32 r, int32 a) {
     Gather(x, n, r, a, m, s.get());
     return kwfft_real(plan, s.get(), h.get(), 1, 1, m);
@@ -40,7 +40,7 @@ struct ComplexPhase {
   const kwfft_table* plan;
   int32 m;
   HeapScratch<cx> s, S;
-  ErrorCode Allocate() { return s.Allocate(m) == TSM_SUCCESS ? S.Allocate(m) : TSM_ERR_NO_MEMORY; }
+  bool Allocate() { return s.Allocate(m) && S.Allocate(m); }
   ErrorCode Transform(const cx* x, int32 n, int32 r, int32 a) {
     Gather(x, n, r, a, m, s.get());
     return kwfft_complex(plan, &s[0].re, &s[0].im, &S[0].re, &S[0].im, 2, 2, m);
@@ -58,7 +58,7 @@ ErrorCode Zoom(const kwfft_table* plan, T* x, int32 n, int32 a, int32 m, int32 k
     for (std::int64_t j = 0; j < len; ++j) x[j] += x[start + j];
   }
   Phase phase{plan, m, {}, {}};
-  if (phase.Allocate() != TSM_SUCCESS) return TSM_ERR_NO_MEMORY;
+  if (!phase.Allocate()) return TSM_ERR_NO_MEMORY;
   std::fill(X, X + Q, cx{0.0, 0.0});
   const int32 km = k >= 0 ? k % m : m - (-static_cast<std::int64_t>(k)) % m;
   const f64 w = kKwfftTwoPi / static_cast<f64>(P);

@@ -30,7 +30,7 @@ int32 ChirpZEntry(Block** x, const ::cx* A, const ::cx* W, int32 outputSize, int
   const int32 M = outputSize < 1 ? n : outputSize;
   if (ResizeOutput(X, M) != 0) return FailB(TSM_ERR_NO_MEMORY, X);
   const ErrorCode code = kernel(Elems(x), n, Load(A), Load(W), M, method, Elems(X));
-  return Failed(code, FailOn::kNonZero) ? FailB(code, X) : code;
+  return ReportB(code, X);
 }
 
 // Plans of the two dimensions: two plain holders, or the two slots of one
@@ -62,7 +62,7 @@ int32 ZoomEntry(Block** x, int32 decimation, int32 length, int32 startBin, int32
   if (const ErrorCode e = state.Ensure(length, &plan); e != TSM_SUCCESS) return FailB(e, X);
   if (const int32 r = ResizeOutput(X, outputSize); r != 0) return FailB(r, X);
   const ErrorCode code = kernel(plan, Elems(x), n, decimation, length, startBin, outputSize, Elems(X));
-  return Failed(code, FailOn::kNonZero) ? FailB(code, X) : code;
+  return ReportB(code, X);
 }
 
 template <class Block, class State, class Kernel>
@@ -77,7 +77,7 @@ int32 Fft2DEntry(Block** x, int32 rowOffset, int32 colOffset, int32 rows, int32 
   if (const int32 r = ResizeOutput(X, rows, cols); r != 0) return FailB(r, X);
   const ErrorCode code =
       kernel(planCols, planRows, Elems(x), inRows, inCols, rowOffset, colOffset, rows, cols, shift, Elems(X));
-  return Failed(code, FailOn::kNonZero) ? FailB(code, X) : code;
+  return ReportB(code, X);
 }
 
 template <class Out, class State, class Kernel>
@@ -88,7 +88,7 @@ int32 InvFft2DEntry(CxMatrixHdl X, int32 shift, Out**& x, const State& state, Ke
   if (const ErrorCode e = state.Ensure(cols, rows, &planCols, &planRows); e != TSM_SUCCESS) return FailB(e, x);
   if (const int32 r = ResizeOutput(x, rows, cols); r != 0) return FailB(r, x);
   const ErrorCode code = kernel(planCols, planRows, Elems(X), rows, cols, shift, Elems(x));
-  return Failed(code, FailOn::kNonZero) ? FailB(code, x) : code;
+  return ReportB(code, x);
 }
 
 }  // namespace
@@ -109,7 +109,7 @@ int32_t InvChirpZT_head(CxArrayHdl X, ::cx* A, ::cx* W, int32_t outputSize, CxAr
   if (M > n) return FailB(TSM_ERR_SIZE_PAIR, x);
   if (ResizeOutput(x, M) != 0) return FailB(TSM_ERR_NO_MEMORY, x);
   const ErrorCode code = InvChirpZ(Elems(X), M, Load(A), Load(W), Elems(x));
-  return Failed(code, FailOn::kNonZero) ? FailB(code, x) : code;
+  return ReportB(code, x);
 }
 
 int32_t ReDZTH(F64ArrayHdl x, int32_t decimation, int32_t length, int32_t startBin, int32_t outputSize,

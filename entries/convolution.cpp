@@ -48,7 +48,7 @@ int32 MatrixPairB(Block** x, Block** y, Block**& out, int32 outputSize, Kernel k
     return FailB(e, out);
   if (ResizeOutput(out, rows, cols) != 0) return FailB(TSM_ERR_NO_MEMORY, out);
   const ErrorCode code = kernel(Elems(x), r1, c1, Elems(y), r2, c2, Elems(out));
-  return Failed(code, FailOn::kNonZero) ? FailB(code, out) : code;
+  return ReportB(code, out);
 }
 
 }  // namespace
@@ -102,7 +102,7 @@ int32_t CxConvolution(CxArrayHdl x, CxArrayHdl y, CxArrayHdl out, int32_t algori
   if (const int32 r = ResizeOutput(out, n + m - 1); r != 0) return FailB(r, out);
   const ErrorCode code = correlate != 0 ? CxCorrelate(Elems(x), n, Elems(y), m, Elems(out), algorithm, normalization)
                                         : CxConvolve(Elems(x), n, Elems(y), m, Elems(out), algorithm);
-  return Failed(code, FailOn::kNonZero) ? FailB(code, out) : code;
+  return ReportB(code, out);
 }
 
 int32_t Convolve_2DH(MatrixHdl x, MatrixHdl y, MatrixHdl out, int32_t outputSize, int32_t algorithm) {

@@ -24,9 +24,9 @@ double Dist(cx a, CxL b) { return static_cast<double>(std::abs(CxL(a.re, a.im) -
 
 using ChirpZ = HostRunTest;
 
-// Every power is taken in polar form, so a term's phase is off by up to
-// (i |log A| + i k |log W|) eps; the bound is 16 eps of each term's magnitude
-// times (1 + that phase), summed.
+// Off the unit circle the terms' moduli spread exponentially, and Bluestein's
+// convolution is good only relative to its largest terms: the bound is 16 eps
+// of each term's modulus times (1 + i |log A| + i k |log W|), summed.
 TEST_F(ChirpZ, GoldenSpiralsByBothMethods) {
   std::ifstream in(TSM_TEST_DATA "/conv_golden.txt");
   std::string s;

@@ -1,6 +1,7 @@
 /* Automatically generated from entries/exports.table, do not edit.
  * Regenerate: cmake -P tools/gen_exports.cmake
  * 134 exports. Included by tsmath.h inside its extern "C" block. */
+ * 151 exports. Included by tsmath.h inside its extern "C" block. */
 #ifndef TSMATH_EXPORTS_H
 #define TSMATH_EXPORTS_H
 
@@ -67,6 +68,36 @@ TSM_API int32_t ReKWFFTH(F64ArrayHdl x, CxArrayHdl X, PlanHolder** state);
 TSM_API int32_t CxKWFFTH(CxArrayHdl x, CxArrayHdl X, PlanHolder** state);
 TSM_API int32_t InvReKWFFTH(CxArrayHdl X, F64ArrayHdl x, PlanHolder** state);
 TSM_API int32_t InvCxKWFFTH(CxArrayHdl X, CxArrayHdl x, PlanHolder** state);
+
+/* Convolution and correlation */
+TSM_API int32_t AutoCorrelation80(F64ArrayHdl x, int32_t normalization, int32_t* err);
+TSM_API int32_t AutoCorrelation(F64ArrayHdl x, int32_t* err);
+TSM_API int32_t Rxy80(F64ArrayHdl x, F64ArrayHdl y, F64ArrayHdl out, int32_t* algorithm, int32_t normalization, int32_t* err);
+TSM_API int32_t Rxy(F64ArrayHdl x, F64ArrayHdl y, F64ArrayHdl out, int32_t* algorithm, int32_t* err);
+TSM_API int32_t Convolution(F64ArrayHdl x, F64ArrayHdl y, F64ArrayHdl out, int32_t* algorithm, int32_t* err);
+TSM_API int32_t CxConvolution(CxArrayHdl x, CxArrayHdl y, CxArrayHdl out, int32_t algorithm, int32_t correlate, int32_t normalization);
+TSM_API int32_t Convolve_2DH(MatrixHdl x, MatrixHdl y, MatrixHdl out, int32_t outputSize, int32_t algorithm);
+TSM_API int32_t CxConvolve_2DH(CxMatrixHdl x, CxMatrixHdl y, CxMatrixHdl out, int32_t outputSize, int32_t algorithm);
+TSM_API int32_t Correlation_2DH(MatrixHdl x, MatrixHdl y, MatrixHdl out, int32_t algorithm);
+TSM_API int32_t CxCorrelation_2DH(CxMatrixHdl x, CxMatrixHdl y, CxMatrixHdl out, int32_t algorithm);
+TSM_API int32_t Deconvolution(F64ArrayHdl x, F64ArrayHdl y, int32_t* err);
+
+/* Chirp-Z, zoom and 2-D FFT */
+TSM_API int32_t ChirpZT_head(F64ArrayHdl x, cx* A, cx* W, int32_t outputSize, int32_t method, CxArrayHdl X);
+TSM_API int32_t CxChirpZT_head(CxArrayHdl x, cx* A, cx* W, int32_t outputSize, int32_t method, CxArrayHdl X);
+TSM_API int32_t InvChirpZT_head(CxArrayHdl X, cx* A, cx* W, int32_t outputSize, CxArrayHdl x);
+TSM_API int32_t ReDZTH(F64ArrayHdl x, int32_t decimation, int32_t length, int32_t startBin, int32_t outputSize, CxArrayHdl X, PlanHolder** state);
+TSM_API int32_t ReDZTH_IDP(F64ArrayHdl x, int32_t decimation, int32_t length, int32_t startBin, int32_t outputSize, CxArrayHdl X, ReservedTransformState** state);
+TSM_API int32_t CxDZTH(CxArrayHdl x, int32_t decimation, int32_t length, int32_t startBin, int32_t outputSize, CxArrayHdl X, PlanHolder** state);
+TSM_API int32_t CxDZTH_IDP(CxArrayHdl x, int32_t decimation, int32_t length, int32_t startBin, int32_t outputSize, CxArrayHdl X, ReservedTransformState** state);
+TSM_API int32_t ReFFT2D_H(MatrixHdl x, int32_t rowOffset, int32_t colOffset, int32_t rows, int32_t cols, int32_t shift, CxMatrixHdl X, PlanHolder** stateCols, PlanHolder** stateRows);
+TSM_API int32_t ReFFT2D_H_IDP(MatrixHdl x, int32_t rowOffset, int32_t colOffset, int32_t rows, int32_t cols, int32_t shift, CxMatrixHdl X, ReservedTransformState** state);
+TSM_API int32_t CxFFT2D_H(CxMatrixHdl x, int32_t rowOffset, int32_t colOffset, int32_t rows, int32_t cols, int32_t shift, CxMatrixHdl X, PlanHolder** stateCols, PlanHolder** stateRows);
+TSM_API int32_t CxFFT2D_H_IDP(CxMatrixHdl x, int32_t rowOffset, int32_t colOffset, int32_t rows, int32_t cols, int32_t shift, CxMatrixHdl X, ReservedTransformState** state);
+TSM_API int32_t ReInvFFT2D_H(CxMatrixHdl X, int32_t shift, MatrixHdl x, PlanHolder** stateCols, PlanHolder** stateRows);
+TSM_API int32_t ReInvFFT2D_H_IDP(CxMatrixHdl X, int32_t shift, MatrixHdl x, ReservedTransformState** state);
+TSM_API int32_t CxInvFFT2D_H(CxMatrixHdl X, int32_t shift, CxMatrixHdl x, PlanHolder** stateCols, PlanHolder** stateRows);
+TSM_API int32_t CxInvFFT2D_H_IDP(CxMatrixHdl X, int32_t shift, CxMatrixHdl x, ReservedTransformState** state);
 
 /* Spectra and Hilbert */
 TSM_API int32_t SpectrumH(F64ArrayHdl x, PlanHolder** state);

@@ -132,6 +132,82 @@ void Windowing() {
   tsrt_dispose(windowed);
 }
 
+// A noisy periodic signal: a 25 Hz wave with its third harmonic, 1000
+// samples at 1 kHz (period 40 samples), under uniform noise of the same
+// power as the wave. The power spectrum shows the two lines; the biased
+// autocorrelation shows the period as peaks at lags 40, 80, ...
+void PeriodicAnalysis() {
+  const int n = 1000;
+  std::vector<double> v(n);
+  uint64_t s = 777;
+  for (int i = 0; i < n; ++i) {
+    s = s * 6364136223846793005ull + 1442695040888963407ull;
+    const double noise = (static_cast<double>(s >> 11) / 9007199254740992.0 - 0.5) * 2.4;
+    v[i] = std::sin(2 * M_PI * 25 * i / 1000.0) + 0.4 * std::sin(2 * M_PI * 75 * i / 1000.0) + noise;
+  }
+  F64ArrayHdl power = NewArray<F64Array>(TSM_TYPE_F64, v);
+  PlanHolder* state = nullptr;
+  int32_t code = ENTRY(SpectrumH)(power, &state);
+  std::printf("  noisy 25 Hz + 75 Hz wave, power spectrum (SpectrumH code %d), strongest one-sided bins:\n", code);
+  std::vector<std::pair<double, int>> bins;
+  for (int k = 1; k < n / 2; ++k) bins.push_back({2 * F64At(power, k), k});  // both sides of bin k
+  std::sort(bins.begin(), bins.end(), std::greater<>());
+  for (int i = 0; i < 3; ++i) std::printf("    %4d Hz  power %.6f\n", bins[i].second, bins[i].first);
+
+  F64ArrayHdl r = NewArray<F64Array>(TSM_TYPE_F64, v);
+  ENTRY(AutoCorrelation80)(r, 2, &code);
+  std::printf("  biased autocorrelation (AutoCorrelation80 code %d, %d lags), zero lag at index %d:\n", code,
+              CountOf(r), n - 1);
+  for (int lag : {0, 10, 20, 30, 40, 60, 80, 120})
+    std::printf("    lag %3d  %9.5f\n", lag, F64At(r, n - 1 + lag));
+  std::printf("\n");
+  tsrt_dispose(power);
+  tsrt_dispose(r);
+}
+
+// A trapezoidal pulse train sampled at 1 MHz: levels 0.2 V and 3.3 V, period
+// 100 us, 40 us at the top, edges of 8 us (rise) and 4 us (fall), a 6 %
+// overshoot after each rising edge that dies away, and +-10 mV of noise.
+void PulseTrain() {
+  const int n = 1000;
+  const double dt = 1e-6, low = 0.2, high = 3.3, amp = high - low;
+  std::vector<double> v(n);
+  uint64_t s = 4242;
+  for (int i = 0; i < n; ++i) {
+    const double t = std::fmod(i + 10.0, 100.0);  // samples into the period
+    double y = t < 8 ? t / 8 : t < 48 ? 1 : t < 52 ? 1 - (t - 48) / 4 : 0;
+    if (t >= 8 && t < 48) y += 0.06 * std::exp(-(t - 8) / 3) * std::cos((t - 8) * 0.8);
+    s = s * 6364136223846793005ull + 1442695040888963407ull;
+    const double noise = (static_cast<double>(s >> 11) / 9007199254740992.0 - 0.5) * 0.02;
+    v[i] = low + amp * y + noise;
+  }
+  F64ArrayHdl x = NewArray<F64Array>(TSM_TYPE_F64, v);
+  const ReferenceLevels refs{90, 50, 10, 1};
+  const LevelMethod levels{0, 200};
+  HistogramBuffer* histogram = nullptr;
+  double hi = 0, lo = 0, a = 0;
+  int32_t code = ENTRY(StateLevels)(x, 0.0, dt, 0, 200, &histogram, &hi, &lo, &a, 0);
+  std::printf("  pulse train, 0.2 V / 3.3 V, period 100 us, 40 us high, edges 8 us and 4 us, 6 %% overshoot:\n");
+  std::printf("    state levels (histogram): low %.4f V, high %.4f V, amplitude %.4f V  (code %d)\n", lo, hi, a,
+              code);
+  double period = 0, width = 0, duty = 0, center = 0, lowRef = 0, midRef = 0, highRef = 0;
+  code = ENTRY(PulseMeasEx)(x, 0.0, dt, 1, 0, 1, &refs, &levels, &histogram, &period, &width, &duty, &center,
+                            &lowRef, &midRef, &highRef, 0);
+  std::printf("    pulse 1: period %.3f us, width %.3f us, duty cycle %.2f %%, centre %.3f us  (code %d)\n",
+              period * 1e6, width * 1e6, duty * 100, center * 1e6, code);
+  for (uint16_t polarity : {1, 0}) {
+    double slope = 0, duration = 0, start = 0, end = 0, preU = 0, preO = 0, postU = 0, postO = 0;
+    code = ENTRY(TransMeas)(x, 0.0, dt, polarity, 1, &refs, &levels, &histogram, &slope, &duration, &start, &end,
+                            &lowRef, &midRef, &highRef, &preU, &preO, &postU, &postO, 0);
+    std::printf("    %s edge 1: 10-90 %% time %.3f us, slope %.4f V/us, overshoot %.2f %%, undershoot %.2f %%"
+                "  (code %d)\n",
+                polarity == 1 ? "rising " : "falling", duration * 1e6, slope * 1e-6, polarity == 1 ? postO : postU,
+                polarity == 1 ? postU : postO, code);
+  }
+  std::printf("\n");
+  tsrt_dispose(x);
+}
+
 }  // namespace
 
 int main(int argc, char** argv) {
@@ -230,6 +306,8 @@ int main(int argc, char** argv) {
 
   Spectrum();
   Windowing();
+  PeriodicAnalysis();
+  PulseTrain();
 
   ENTRY(DisableAnalysisWorkspaceH)(&err);
   ENTRY(UninitializeAnalysisWorkspaceH)(&err);

@@ -84,7 +84,15 @@ int32_t AutoCorrelation80(F64ArrayHdl x, int32_t normalization, int32_t* err) {
       static_cast<f64*>(std::malloc(sizeof(f64) * static_cast<std::size_t>(n))), &std::free);
   if (!copy) return FailA(err, TSM_ERR_NO_MEMORY, x);
   std::memcpy(copy.get(), Elems(x), sizeof(f64) * static_cast<std::size_t>(n));
-  if (const int32 r = ResizeOutput(x, 2 * n - 1); r != 0) return HostFailA(err, r, x);
+  if (const int32 r = ResizeOutput(x, 2 * n - 1); r != 0) {
+    // The run goes on after a refused resize and its code replaces -20001, but
+    // into scratch: x could not grow, so it keeps its count and values.
+    *err = TSM_ERR_NO_MEMORY;
+    const std::unique_ptr<f64, decltype(&std::free)> lags(
+        static_cast<f64*>(std::malloc(sizeof(f64) * static_cast<std::size_t>(2 * n - 1))), &std::free);
+    if (lags) *err = Correlate(copy.get(), n, copy.get(), n, kConvolveFft, lags.get(), normalization);
+    return r;
+  }
   const ErrorCode code = Correlate(copy.get(), n, copy.get(), n, kConvolveFft, Elems(x), normalization);
   if (Failed(code, FailOn::kNonZero)) return FailA(err, code, x);
   return 0;

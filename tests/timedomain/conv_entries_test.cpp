@@ -211,7 +211,17 @@ TEST_F(ConvEntries, ResizeFailureAtEachResize) {
     EXPECT_EQ(err, 0);
     EXPECT_EQ(tsrt_resize_calls() - before, 1);
   };
-  inPlace(a, [](F64& t, int32_t* e) { return AutoCorrelation80(t.Handle(), 1, e); });
+  {  // a refused resize: the correlation still runs (into scratch) and its code replaces -20001
+    F64 t(a);
+    int32_t err = 0;
+    for (const auto& [norm, code] : {std::pair{1, 0}, std::pair{7, int{TSM_ERR_BAD_SELECTOR}}}) {
+      tsrt_fail_resize_at(1);
+      EXPECT_NE(AutoCorrelation80(t.Handle(), norm, &err), 0);
+      EXPECT_EQ(err, code);
+      EXPECT_EQ(t.Count(), static_cast<int32_t>(a.size()));
+    }
+    tsrt_fail_resize_at(0);
+  }
   inPlace(DirectConvolution(a, b), [&](F64& t, int32_t* e) { return Deconvolution(t.Handle(), y.Handle(), e); });
 
   Cx cxa{cx{1, 2}, cx{3, 4}}, cxb{cx{0, 1}}, cout;

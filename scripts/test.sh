@@ -16,5 +16,5 @@ echo "== AddressSanitizer + UndefinedBehaviorSanitizer"
 (cd "$here/build-asan" && ctest --output-on-failure -j "$jobs")
 
 echo "== ThreadSanitizer (concurrency tests)"
-"$here/scripts/build.sh" "$here/build-tsan" tsan
+TSM_TARGETS="test_frame_concurrency test_fft_concurrency" "$here/scripts/build.sh" "$here/build-tsan" tsan
 (cd "$here/build-tsan" && ctest --output-on-failure -j "$jobs" -L concurrency)

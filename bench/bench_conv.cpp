@@ -15,15 +15,11 @@
 #include "transforms/fft2d.h"
 #include "transforms/kwfft_plan.h"
 
+#include "bench_support.h"
+
 namespace {
 
-std::vector<double> Noise(size_t n, unsigned seed) {
-  std::mt19937_64 rng(seed);
-  std::uniform_real_distribution<double> u(-1, 1);
-  std::vector<double> v(n);
-  for (double& x : v) x = u(rng);
-  return v;
-}
+using bench::Noise;
 
 void Convolve(benchmark::State& state, int32_t algorithm) {
   const int n = static_cast<int>(state.range(0)), m = static_cast<int>(state.range(1));

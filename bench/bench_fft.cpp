@@ -10,17 +10,13 @@
 
 #include "transforms/kwfft.h"
 
+#include "bench_support.h"
+
 namespace {
 
 const std::vector<int64_t> kLengths = {64, 256, 1000, 1024, 4096, 44100, 48000, 65536, 1 << 20, 1009, 4099, 10007};
 
-std::vector<double> Noise(size_t n, unsigned seed) {
-  std::mt19937_64 rng(seed);
-  std::uniform_real_distribution<double> u(-1, 1);
-  std::vector<double> v(n);
-  for (double& x : v) x = u(rng);
-  return v;
-}
+using bench::Noise;
 
 void SetItems(benchmark::State& state, int n) {
   state.SetItemsProcessed(state.iterations() * n);

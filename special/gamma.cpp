@@ -122,7 +122,7 @@ f64 LogGamma(f64 x) {
   const f64 q = (x - 0.5) * std::log(x) - x + kLogSqrtTwoPi;
   const f64 p = 1.0 / (x * x);
   if (x < 1000.0) return q + PolyEval(p, kLogGammaA, 4) / x;
-  return q + ((7.9365079365079365e-4 * p - 2.7777777777777778e-3) * p + 0.08333333333333333) / x;
+  return q + ((0.0007936507936507937 * p - 0.002777777777777778) * p + 0.08333333333333333) / x;
 }
 
 f64 Factorial(int32 n) {

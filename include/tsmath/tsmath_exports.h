@@ -1,6 +1,7 @@
 /* Automatically generated from entries/exports.table, do not edit.
  * Regenerate: cmake -P tools/gen_exports.cmake
  * 160 exports. Included by tsmath.h inside its extern "C" block. */
+ * 148 exports. Included by tsmath.h inside its extern "C" block. */
 #ifndef TSMATH_EXPORTS_H
 #define TSMATH_EXPORTS_H
 
@@ -185,5 +186,21 @@ TSM_API int32_t measurements_fetch(void* reserved, int32_t selector, const Refer
 TSM_API int32_t measurements_create(void* object);
 TSM_API int32_t measurements_clear(void* object);
 TSM_API int32_t measurements_destroy(void* object);
+
+/* Special functions: gamma, beta and error function */
+TSM_API void TS_Fact(int32_t n, double* out);
+TSM_API void TS_LnFact(int32_t n, double* out);
+TSM_API void TS_Gamma(double a, double x, double* out);
+TSM_API void TS_Gamma_85(double a, double x, double* out, int32_t mode);
+TSM_API void TS_GammaC(double a, double x, double* out);
+TSM_API void TS_LnGamma(double x, double* out);
+TSM_API void TS_Psi(double x, double* out);
+TSM_API void TS_Stirling(double x, double* out);
+TSM_API void TS_Beta(double a, double b, double x, double* out);
+TSM_API void TS_Beta_85(double a, double b, double x, double* out, int32_t mode);
+TSM_API void TS_Erf(double x, double* out);
+TSM_API void TS_ErfC(double x, double* out);
+TSM_API void TS_Dawson(double x, double* out);
+TSM_API void TS_Zeta(double x, double* out);
 
 #endif

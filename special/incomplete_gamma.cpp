@@ -1,0 +1,95 @@
+// Regularised incomplete gamma functions P(a, x) (IncompleteGamma) and
+// Q(a, x) = 1 - P(a, x) (IncompleteGammaC), a > 0, x >= 0.
+//
+// P: the power series sum x^k / (a+1)...(a+k) times x^a e^-x / Gamma(a + 1),
+//   for x <= 1 or x <= a; otherwise 1 - Q.
+// Q: the continued fraction of Legendre, two pairs of convergents rescaled by
+//   2^-57 when they grow past 2^57, for x >= 1 and x >= a; otherwise 1 - P.
+// Both stop at a relative change of at most MACHEP. The factor
+// exp(a ln x - x - ln Gamma(a)) limits accuracy for large a and x: its
+// exponent carries an absolute error of a few eps times |a ln x| + x.
+//
+// Accuracy against mpmath at 40 digits (docs/accuracy.md), a in 0.01 .. 40,
+// x in 1e-3 .. 80, where 1 + |a ln x| + x + |ln Gamma(a)| <= 20: P max 4.3e-15,
+// Q max 1.1e-14 relative (Q below x = 1 or a is 1 - P and loses P/Q more).
+#include <cmath>
+#include <limits>
+
+#include "special/common.h"
+#include "special/gamma.h"
+
+namespace tsm {
+namespace {
+
+constexpr f64 kInf = std::numeric_limits<f64>::infinity();
+// A guard against a fraction that never settles (it converges in well under
+// a hundred rounds wherever it is used).
+constexpr int32 kMaxFractionRounds = 10000;
+
+// ln(x^a e^-x / Gamma(a)).
+f64 LogPowerFactor(f64 a, f64 x) { return a * std::log(x) - x - LogGamma(a); }
+
+}  // namespace
+
+f64 IncompleteGamma(f64 a, f64 x) {
+  const int32 sx = InfinitySign(x);
+  if (sx > 0) return 1.0;
+  if (IsNaNValue(x) || sx < 0) return kNaN;
+  if (IsNaNValue(a) || InfinitySign(a) < 0) return kNaN;
+  if (InfinitySign(a) > 0 && x > 0) return kInf;
+  if (x < 0 || a <= 0) return MathError(kMathDomain, kNaN);
+  if (x == 0) return 0.0;
+  if (x > 1.0 && x > a) return 1.0 - IncompleteGammaC(a, x);
+  const f64 ax = LogPowerFactor(a, x);
+  if (!IsFiniteValue(ax)) return kInf;
+  f64 r = a, c = 1.0, ans = 1.0;
+  do {
+    r += 1.0;
+    c *= x / r;
+    ans += c;
+  } while (c / ans > kMachEp);
+  return ans * std::exp(ax) / a;
+}
+
+f64 IncompleteGammaC(f64 a, f64 x) {
+  const int32 sx = InfinitySign(x);
+  if (sx > 0) return 0.0;
+  if (IsNaNValue(x) || sx < 0) return kNaN;
+  if (IsNaNValue(a) || InfinitySign(a) < 0) return kNaN;
+  if (InfinitySign(a) > 0) return kInf;
+  if (x < 0 || a <= 0) return MathError(kMathDomain, kNaN);
+  if (x == 0) return 1.0;
+  if (x < 1.0 || x < a) return 1.0 - IncompleteGamma(a, x);
+  f64 y = 1.0 - a, z = x + y + 1.0, c = 0.0;
+  f64 pkm2 = 1.0, qkm2 = x, pkm1 = x + 1.0, qkm1 = z * x;
+  f64 ans = pkm1 / qkm1, t;
+  int32 rounds = 0;
+  do {
+    c += 1.0;
+    y += 1.0;
+    z += 2.0;
+    const f64 yc = y * c;
+    const f64 pk = pkm1 * z - pkm2 * yc;
+    const f64 qk = qkm1 * z - qkm2 * yc;
+    if (qk != 0) {
+      const f64 r = pk / qk;
+      t = std::fabs((ans - r) / r);
+      ans = r;
+    } else {
+      t = 1.0;
+    }
+    pkm2 = pkm1;
+    pkm1 = pk;
+    qkm2 = qkm1;
+    qkm1 = qk;
+    if (std::fabs(pk) > kBig) {
+      pkm2 *= kBigInv;
+      pkm1 *= kBigInv;
+      qkm2 *= kBigInv;
+      qkm1 *= kBigInv;
+    }
+  } while (t > kMachEp && ++rounds < kMaxFractionRounds);
+  return ans * std::exp(LogPowerFactor(a, x));
+}
+
+}  // namespace tsm

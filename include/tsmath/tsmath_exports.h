@@ -1,7 +1,6 @@
 /* Automatically generated from entries/exports.table, do not edit.
  * Regenerate: cmake -P tools/gen_exports.cmake
- * 160 exports. Included by tsmath.h inside its extern "C" block. */
- * 148 exports. Included by tsmath.h inside its extern "C" block. */
+ * 174 exports. Included by tsmath.h inside its extern "C" block. */
 #ifndef TSMATH_EXPORTS_H
 #define TSMATH_EXPORTS_H
 

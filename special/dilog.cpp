@@ -7,8 +7,8 @@
 // spence(x) = pi^2/6 - ln(x) ln(1 - x) - spence(1 - x) and
 // spence(1/x) = -ln(x)^2/2 - spence(x) undo the folding.
 //
-// Accuracy against mpmath (tests/special_integrals, tools/special/accuracy_integrals.py),
-// relative error for x in [0, 1e10]: max 8.9e-16.
+// Accuracy against mpmath at 40 digits (tools/special/accuracy_integrals.py),
+// relative error over 10^4 x in [0, 3] and log-spaced in [1e-10, 1e10]: max 4.0e-16.
 #include "special/dilog.h"
 
 #include <cmath>

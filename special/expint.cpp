@@ -6,9 +6,10 @@
 // fraction, its convergents rescaled by 1/big when they exceed big. x <= 1:
 // the power series with psi(n) = -Euler + sum_{k<n} 1/k.
 //
-// Accuracy against mpmath (tests/special_integrals, tools/special/accuracy_integrals.py),
-// relative error, x in [1e-8, 709], n in {0, 1, 2, 3, 5, 10, 30, 100, 1000, 5000}:
-//   max 1.1e-15
+// Accuracy against mpmath at 40 digits (tools/special/accuracy_integrals.py),
+// relative error over 10^4 points, x log-spaced in [1e-8, 700] and n in
+// {0, 1, 2, 3, 5, 10, 30, 100, 1000, 5000, 5001, 20000}, results in the normal
+// range: max 2.7e-15 (the expansion for n above 5000: 1.4e-15 at n = 5001).
 #include "special/expint.h"
 
 #include <cmath>

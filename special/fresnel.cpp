@@ -7,8 +7,8 @@
 //                  reduced exactly (x^2 split into two doubles, modulo 4).
 // Above 36974: 0.5 and 0.5 (the oscillation is below 1/(pi x) < 8.7e-6 there).
 //
-// Accuracy against mpmath (tests/special_integrals, tools/special/accuracy_integrals.py),
-// relative error for x in [1e-8, 36974]: S and C max 6.7e-16.
+// Accuracy against mpmath at 40 digits (tools/special/accuracy_integrals.py),
+// relative error over 10^4 log-spaced x in [1e-8, 36974]: S and C max 3.7e-16.
 #include "special/fresnel.h"
 
 #include <cmath>

@@ -1,6 +1,7 @@
 /* Automatically generated from entries/exports.table, do not edit.
  * Regenerate: cmake -P tools/gen_exports.cmake
  * 174 exports. Included by tsmath.h inside its extern "C" block. */
+ * 146 exports. Included by tsmath.h inside its extern "C" block. */
 #ifndef TSMATH_EXPORTS_H
 #define TSMATH_EXPORTS_H
 
@@ -201,5 +202,18 @@ TSM_API void TS_Erf(double x, double* out);
 TSM_API void TS_ErfC(double x, double* out);
 TSM_API void TS_Dawson(double x, double* out);
 TSM_API void TS_Zeta(double x, double* out);
+/* Special functions: integrals and elliptic functions */
+TSM_API void TS_FresnelIntegrals(double x, double* s, double* c);
+TSM_API void TS_ExpI(double x, int32_t n, double* result);
+TSM_API void TS_SinI(double x, double* result);
+TSM_API void TS_CosI(double x, double* result);
+TSM_API void TS_SinhI(double x, double* result);
+TSM_API void TS_CoshI(double x, double* result);
+TSM_API void TS_Elliptic1(double m, double phi, double* result);
+TSM_API void TS_Elliptic1_85(double m, double phi, double* result, int32_t mode);
+TSM_API void TS_Elliptic2(double m, double phi, double* result);
+TSM_API void TS_Elliptic2_85(double m, double phi, double* result, int32_t mode);
+TSM_API void TS_EllipticJ(double u, double m, double* sn, double* cn, double* dn, double* phi);
+TSM_API void TS_Diln(double x, double* result);
 
 #endif

@@ -1,7 +1,6 @@
 /* Automatically generated from entries/exports.table, do not edit.
  * Regenerate: cmake -P tools/gen_exports.cmake
- * 174 exports. Included by tsmath.h inside its extern "C" block. */
- * 146 exports. Included by tsmath.h inside its extern "C" block. */
+ * 186 exports. Included by tsmath.h inside its extern "C" block. */
 #ifndef TSMATH_EXPORTS_H
 #define TSMATH_EXPORTS_H
 
@@ -202,6 +201,7 @@ TSM_API void TS_Erf(double x, double* out);
 TSM_API void TS_ErfC(double x, double* out);
 TSM_API void TS_Dawson(double x, double* out);
 TSM_API void TS_Zeta(double x, double* out);
+
 /* Special functions: integrals and elliptic functions */
 TSM_API void TS_FresnelIntegrals(double x, double* s, double* c);
 TSM_API void TS_ExpI(double x, int32_t n, double* result);

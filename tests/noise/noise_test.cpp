@@ -189,6 +189,43 @@ TEST(Noise, DiscreteDeviatesFollowTheirDistributions) {
   EXPECT_EQ(BinomialV(6, 40, 1.0, 3, s, c), V(6, 40.0));
 }
 
+// Below its switch point each direct method is a plain function of the
+// reference stream; at the switch point the rejection method takes over.
+TEST(Noise, DirectMethodsBelowTheirSwitchPoints) {
+  const V& u = Gold().uniform.at(1);
+  const auto direct_gamma = [&](int order, int i) {
+    LD prod = 1;
+    for (int j = 0; j < order; ++j) prod *= u[order * i + j];
+    return static_cast<double>(-std::log(prod));
+  };
+  const auto direct_poisson = [&](double mean, int count) {
+    V out;
+    size_t at = 0;
+    for (int i = 0; i < count; ++i) {
+      double k = -1, t = 1;
+      do k += 1, t *= u.at(at++);
+      while (t > std::exp(-mean));
+      out.push_back(k);
+    }
+    return out;
+  };
+  const auto direct_binomial = [&](int trials, double p) {
+    double c = 0;
+    for (int j = 0; j < trials; ++j) c += u[j] < p;
+    return V{c};
+  };
+  NoiseState s{};
+  BinomialCache c{};
+  const V g5 = GammaV(8, 5, 1, s);
+  for (int i = 0; i < 8; ++i) EXPECT_NEAR(g5[i], direct_gamma(5, i), 8 * kEps * std::fabs(g5[i]) + 1e-15) << i;
+  EXPECT_NE(GammaV(1, 6, 1, s)[0], direct_gamma(6, 0));
+  EXPECT_EQ(PoissonV(2, 11.99, 1, s), direct_poisson(11.99, 2));
+  EXPECT_NE(PoissonV(2, 12, 1, s), direct_poisson(12, 2));
+  EXPECT_EQ(BinomialV(1, 24, 0.3, 1, s, c), direct_binomial(24, 0.3));
+  EXPECT_EQ(BinomialV(1, 24, 0.7, 1, s, c), V{24 - direct_binomial(24, 0.3)[0]});
+  EXPECT_NE(BinomialV(1, 25, 0.4, 1, s, c), direct_binomial(25, 0.4));
+}
+
 // One call of 25 samples equals calls of 10 and 15, the second continuing
 // the first through the caller's records.
 TEST(Noise, StreamsContinueAcrossCalls) {

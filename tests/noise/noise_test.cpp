@@ -216,6 +216,15 @@ TEST(Noise, DirectMethodsBelowTheirSwitchPoints) {
   };
   NoiseState s{};
   BinomialCache c{};
+  GaussSpare spare{};
+  size_t at = 0;  // the polar method: b f now, a f kept for the next output
+  LD a, b, r;
+  do a = 2.0L * u[at] - 1, b = 2.0L * u[at + 1] - 1, r = a * a + b * b, at += 2;
+  while (!(r < 1 && r > 0));
+  const LD f = std::sqrt(-2 * std::log(r) / r);
+  const V gs = GaussV(2, 3, 1, s, spare);
+  EXPECT_NEAR(gs[0], static_cast<double>(3 * b * f), 1e-12);
+  EXPECT_NEAR(gs[1], static_cast<double>(3 * a * f), 1e-12);
   const V g5 = GammaV(8, 5, 1, s);
   for (int i = 0; i < 8; ++i) EXPECT_NEAR(g5[i], direct_gamma(5, i), 8 * kEps * std::fabs(g5[i]) + 1e-15) << i;
   EXPECT_NE(GammaV(1, 6, 1, s)[0], direct_gamma(6, 0));
@@ -287,7 +296,7 @@ TEST(Noise, RifflesPermuteWithTheExactDistributionOfTheirMode) {
     V idx;
     for (int k = 0; k < kCalls; ++k) {
       I32 out;
-      ASSERT_EQ(RiffleIntNum2012_head(out.Handle(), n, k == 0 ? 99 : -1, &s, mode), 0);
+      ASSERT_EQ(RiffleIntNum2012_head(out.Handle(), n, k + 1, &s, mode), 0);
       idx.push_back(PermIndex(out.Values()));
     }
     ExpectChiSquare(idx, [&](int k) { return mode == 0 ? classic[k] : 1.0L / kFact; }, kFact - 1,
@@ -353,6 +362,31 @@ TEST(Noise, PeriodNoiseIsTheInverseTransformOfItsSpectrum) {
         sum += 2 * (n * amp * 0.5L) * std::cos(ks[k - 1] + 2 * 3.14159265358979323846L * k * t / n);
       EXPECT_NEAR(out.At(t), static_cast<double>(sum / n), 64 * kEps * amp * n) << n << " " << t;
     }
+  }
+}
+
+// Scratch from the arena: the same samples, and -20001 when it is too small.
+TEST(Noise, PeriodNoiseInTheArena) {
+  const auto run = [](int32_t* err) {
+    int32_t n = 64, seed = 3;
+    double amp = 1;
+    NoiseState s{};
+    F64 out;
+    PeriodNoise(&n, &amp, &seed, out.Handle(), err, &s);
+    return out.Values();
+  };
+  int32_t err = 1;
+  const V heap = run(&err);
+  for (uint32_t size : {1u << 16, 100u}) {
+    ErrorCluster cl{0, 0};
+    InitializeAnalysisWorkspaceH(size, &cl);
+    EnableAnalysisWorkspaceH(&cl);
+    const V arena = run(&err);
+    DisableAnalysisWorkspaceH(&cl);
+    UninitializeAnalysisWorkspaceH(&cl);
+    EXPECT_EQ(cl.status, 0);
+    EXPECT_EQ(err, size == 100u ? -20001 : 0);
+    EXPECT_EQ(arena, size == 100u ? V{} : heap);
   }
 }
 

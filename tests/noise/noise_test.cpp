@@ -50,49 +50,53 @@ const Golden& Gold() {
   return g;
 }
 
-// Calls that fill n samples from a state record; seed -1 continues.
-V White(int32_t n, double amp, int32_t seed, NoiseState& s, int32_t* err = nullptr) {
+// The caller's records of a stream, and one call of a noise entry: kind,
+// count, the distribution's parameter (amp, sd, order, mean or trials), the
+// binomial p. ret is the entry's result, code its error code; the output
+// starts with a stale sample.
+struct Rec {
+  NoiseState s{};
+  GaussSpare g{};
+  BinomialCache c{};
+};
+struct Res {
+  int32_t ret, code;
+  V y;
+};
+Res NoiseInto(F64& out, U32& bin, const std::string& kind, int32_t n, double a, int32_t seed, Rec& r, double p) {
+  int32_t e = 1, ret;
+  if (kind == "white") ret = white(out.Handle(), &n, &a, &seed, &e, &r.s);
+  else if (kind == "gauss") ret = Gauss(out.Handle(), &n, &a, &seed, &e, &r.s, &r.g);
+  else if (kind == "period") ret = PeriodNoise(&n, &a, &seed, out.Handle(), &e, &r.s);
+  else if (kind == "gamma") ret = e = GammaNoiseH(out.Handle(), n, static_cast<int32_t>(a), seed, &r.s);
+  else if (kind == "poisson") ret = e = PoissonNoiseH(out.Handle(), n, a, seed, &r.s);
+  else ret = e = BinomialNoiseH(bin.Handle(), n, static_cast<int32_t>(a), p, seed, &r.s, &r.c);
+  if (kind != "binomial") return {ret, e, out.Values()};
+  const auto u = bin.Values();
+  return {ret, e, V(u.begin(), u.end())};
+}
+Res Noise(const std::string& kind, int32_t n, double a, int32_t seed, Rec& r, double p = 0.5) {
   F64 out{7};
-  int32_t e = 1;
-  white(out.Handle(), &n, &amp, &seed, err ? err : &e, &s);
-  return out.Values();
+  U32 bin{7};
+  return NoiseInto(out, bin, kind, n, a, seed, r, p);
 }
-V GaussV(int32_t n, double sd, int32_t seed, NoiseState& s, GaussSpare& g) {
-  F64 out;
-  int32_t e = 1;
-  Gauss(out.Handle(), &n, &sd, &seed, &e, &s, &g);
-  return out.Values();
-}
-V GammaV(int32_t n, int32_t order, int32_t seed, NoiseState& s) {
-  F64 out;
-  EXPECT_EQ(GammaNoiseH(out.Handle(), n, order, seed, &s), 0);
-  return out.Values();
-}
-V PoissonV(int32_t n, double mean, int32_t seed, NoiseState& s) {
-  F64 out;
-  EXPECT_EQ(PoissonNoiseH(out.Handle(), n, mean, seed, &s), 0);
-  return out.Values();
-}
-V BinomialV(int32_t n, int32_t trials, double p, int32_t seed, NoiseState& s, BinomialCache& c) {
-  U32 out;
-  EXPECT_EQ(BinomialNoiseH(out.Handle(), n, trials, p, seed, &s, &c), 0);
-  const auto u = out.Values();
-  return V(u.begin(), u.end());
+V Samples(const std::string& kind, int32_t n, double a, int32_t seed, double p = 0.5) {
+  Rec r;
+  return Noise(kind, n, a, seed, r, p).y;
 }
 
 TEST(Noise, UniformStreamAndWordsMatchTheReference) {
   for (const auto& [seed, u] : Gold().uniform) {
-    NoiseState s{5, 6, 7};
-    const V y = White(40, 0.5, seed, s);
+    Rec r{{5, 6, 7}};
+    const V y = Noise("white", 40, 0.5, seed, r).y;
     ASSERT_EQ(y.size(), u.size()) << seed;
     for (size_t i = 0; i < u.size(); ++i) EXPECT_NEAR(y[i] + 0.5, u[i], 4 * kEps) << seed << " " << i;
-    EXPECT_EQ((std::vector<int32_t>{s.s1, s.s2, s.s3}), Gold().words.at(seed)) << seed;
+    EXPECT_EQ((std::vector<int32_t>{r.s.s1, r.s.s2, r.s.s3}), Gold().words.at(seed)) << seed;
   }
-  NoiseState zero{0, 0, 0};
-  EXPECT_EQ(White(5, 3, 0, zero), V(5, -3.0));  // a record of zeros sticks at 0
-  NoiseState one{0, 0, 0};
-  White(1, 1, 1, one);
-  EXPECT_EQ((std::vector<int32_t>{one.s1, one.s2, one.s3}), (std::vector<int32_t>{171, 8191 * 172 % 30307, 170}));
+  EXPECT_EQ(Samples("white", 5, 3, 0), V(5, -3.0));  // a record of zeros sticks at 0
+  Rec one;
+  Noise("white", 1, 1, 1, one);
+  EXPECT_EQ((std::vector<int32_t>{one.s.s1, one.s.s2, one.s.s3}), (std::vector<int32_t>{171, 8191 * 172 % 30307, 170}));
 }
 
 // Kolmogorov-Smirnov distance of samples from a CDF.
@@ -112,19 +116,6 @@ LD GammaCdf(int k, LD x) {
   LD term = 1, sum = 1;
   for (int j = 1; j < k; ++j) sum += term *= x / j;
   return 1 - std::exp(-x) * sum;
-}
-
-TEST(Noise, ContinuousDeviatesFollowTheirDistributions) {
-  constexpr int32_t kN = 20000;
-  const double bound = 1.95 / std::sqrt(kN);  // KS at p = 0.001
-  NoiseState s{};
-  GaussSpare g{};
-  EXPECT_LT(KsDistance(GaussV(kN, 2, 17, s, g), [](LD x) { return 0.5L * std::erfc(-x / (2 * std::sqrt(2.0L))); }),
-            bound);
-  for (int order : {1, 3, 5, 6, 7, 20}) {
-    NoiseState t{};
-    EXPECT_LT(KsDistance(GammaV(kN, order, 29, t), [&](LD x) { return GammaCdf(order, x); }), bound) << order;
-  }
 }
 
 // Chi-square of integer samples against a pmf, bins merged from the left
@@ -153,55 +144,48 @@ void ExpectChiSquare(const V& x, const std::function<LD(int)>& pmf, int kmax, co
   EXPECT_LT(chi, df + 4 * std::sqrt(2 * df)) << what << " df " << df;
 }
 
-TEST(Noise, DiscreteDeviatesFollowTheirDistributions) {
+TEST(Noise, DeviatesFollowTheirExactDistributions) {
   constexpr int32_t kN = 20000;
-  for (double mean : {0.5, 3.0, 11.999, 12.0, 40.0}) {
-    NoiseState s{};
+  const double bound = 1.95 / std::sqrt(kN);  // KS at p = 0.001
+  EXPECT_LT(KsDistance(Samples("gauss", kN, 2, 17), [](LD x) { return 0.5L * std::erfc(-x / (2 * std::sqrt(2.0L))); }),
+            bound);
+  for (int order : {1, 5, 6, 20})
+    EXPECT_LT(KsDistance(Samples("gamma", kN, order, 29), [&](LD x) { return GammaCdf(order, x); }), bound) << order;
+  for (double mean : {0.5, 11.999, 12.0, 40.0}) {
     const auto pmf = [&](int k) { return std::exp(k * std::log(static_cast<LD>(mean)) - mean - std::lgamma(k + 1.0L)); };
-    ExpectChiSquare(PoissonV(kN, mean, 31, s), pmf, static_cast<int>(mean + 12 * std::sqrt(mean) + 12),
+    ExpectChiSquare(Samples("poisson", kN, mean, 31), pmf, static_cast<int>(mean + 12 * std::sqrt(mean) + 12),
                     "poisson " + std::to_string(mean));
   }
   // Direct counts, the Poisson-type count below mean 1, rejection; mirrored.
   const std::vector<std::pair<int, double>> cases = {{10, 0.3}, {24, 0.5}, {25, 0.5}, {200, 0.004}, {30, 0.97},
-                                                     {100, 0.7}, {1000, 0.25}, {25, 0.04}};
+                                                     {100, 0.7}, {1000, 0.25}};
   for (const auto& [trials, p] : cases) {
-    NoiseState s{};
-    BinomialCache c{};
     // Below mean 1 the count is Poisson with that mean, capped at trials.
     const LD pp = std::min(p, 1 - p), am = trials * pp;
     const auto poisson = [&](int j) { return std::exp(j * std::log(am) - am - std::lgamma(j + 1.0L)); };
     const auto pmf = [&](int k) {
-      const LD q = p;
       if (trials < 25 || am >= 1)
         return std::exp(std::lgamma(trials + 1.0L) - std::lgamma(k + 1.0L) - std::lgamma(trials - k + 1.0L) +
-                        k * std::log(q) + (trials - k) * std::log1p(-q));
+                        k * std::log(static_cast<LD>(p)) + (trials - k) * std::log1p(-static_cast<LD>(p)));
       const int j = pp == p ? k : trials - k;
       LD below = 0;
       for (int i = 0; i < trials; ++i) below += poisson(i);
       return j < trials ? poisson(j) : 1 - below;
     };
-    ExpectChiSquare(BinomialV(kN, trials, p, 37, s, c), pmf, trials,
-                    "binomial " + std::to_string(trials) + " " + std::to_string(p));
+    ExpectChiSquare(Samples("binomial", kN, trials, 37, p), pmf, trials, "binomial " + std::to_string(trials));
   }
-  NoiseState s{};
-  BinomialCache c{};
-  EXPECT_EQ(BinomialV(6, 40, 0.0, 3, s, c), V(6, 0.0));
-  EXPECT_EQ(BinomialV(6, 40, 1.0, 3, s, c), V(6, 40.0));
+  EXPECT_EQ(Samples("binomial", 6, 40, 3, 0.0), V(6, 0.0));
+  EXPECT_EQ(Samples("binomial", 6, 40, 3, 1.0), V(6, 40.0));
 }
 
 // Below its switch point each direct method is a plain function of the
 // reference stream; at the switch point the rejection method takes over.
-TEST(Noise, DirectMethodsBelowTheirSwitchPoints) {
+TEST(Noise, DirectMethodsFollowTheReferenceStream) {
   const V& u = Gold().uniform.at(1);
-  const auto direct_gamma = [&](int order, int i) {
-    LD prod = 1;
-    for (int j = 0; j < order; ++j) prod *= u[order * i + j];
-    return static_cast<double>(-std::log(prod));
-  };
-  const auto direct_poisson = [&](double mean, int count) {
+  const auto gamma = [&](int order) { LD prod = 1; for (int j = 0; j < order; ++j) prod *= u[j]; return -std::log(prod); };
+  const auto poisson = [&](double mean) {
     V out;
-    size_t at = 0;
-    for (int i = 0; i < count; ++i) {
+    for (size_t at = 0; out.size() < 2;) {
       double k = -1, t = 1;
       do k += 1, t *= u.at(at++);
       while (t > std::exp(-mean));
@@ -209,66 +193,44 @@ TEST(Noise, DirectMethodsBelowTheirSwitchPoints) {
     }
     return out;
   };
-  const auto direct_binomial = [&](int trials, double p) {
-    double c = 0;
-    for (int j = 0; j < trials; ++j) c += u[j] < p;
-    return V{c};
-  };
-  NoiseState s{};
-  BinomialCache c{};
-  GaussSpare spare{};
+  const auto binomial = [&](int trials, double p) { double c = 0; for (int j = 0; j < trials; ++j) c += u[j] < p; return V{c}; };
   size_t at = 0;  // the polar method: b f now, a f kept for the next output
   LD a, b, r;
   do a = 2.0L * u[at] - 1, b = 2.0L * u[at + 1] - 1, r = a * a + b * b, at += 2;
   while (!(r < 1 && r > 0));
   const LD f = std::sqrt(-2 * std::log(r) / r);
-  const V gs = GaussV(2, 3, 1, s, spare);
+  const V gs = Samples("gauss", 2, 3, 1);
   EXPECT_NEAR(gs[0], static_cast<double>(3 * b * f), 1e-12);
   EXPECT_NEAR(gs[1], static_cast<double>(3 * a * f), 1e-12);
-  const V g5 = GammaV(8, 5, 1, s);
-  for (int i = 0; i < 8; ++i) EXPECT_NEAR(g5[i], direct_gamma(5, i), 8 * kEps * std::fabs(g5[i]) + 1e-15) << i;
-  EXPECT_NE(GammaV(1, 6, 1, s)[0], direct_gamma(6, 0));
-  EXPECT_EQ(PoissonV(2, 11.99, 1, s), direct_poisson(11.99, 2));
-  EXPECT_NE(PoissonV(2, 12, 1, s), direct_poisson(12, 2));
-  EXPECT_EQ(BinomialV(1, 24, 0.3, 1, s, c), direct_binomial(24, 0.3));
-  EXPECT_EQ(BinomialV(1, 24, 0.7, 1, s, c), V{24 - direct_binomial(24, 0.3)[0]});
-  EXPECT_NE(BinomialV(1, 25, 0.4, 1, s, c), direct_binomial(25, 0.4));
+  EXPECT_NEAR(Samples("gamma", 1, 5, 1)[0], static_cast<double>(gamma(5)), 1e-14);
+  EXPECT_NE(Samples("gamma", 1, 6, 1)[0], static_cast<double>(gamma(6)));
+  EXPECT_EQ(Samples("poisson", 2, 11.99, 1), poisson(11.99));
+  EXPECT_NE(Samples("poisson", 2, 12, 1), poisson(12));
+  EXPECT_EQ(Samples("binomial", 1, 24, 1, 0.3), binomial(24, 0.3));
+  EXPECT_EQ(Samples("binomial", 1, 24, 1, 0.7), V{24 - binomial(24, 0.3)[0]});
+  EXPECT_NE(Samples("binomial", 1, 25, 1, 0.4), binomial(25, 0.4));
 }
 
-// One call of 25 samples equals calls of 10 and 15, the second continuing
-// the first through the caller's records.
+// One call of 25 samples equals a call of 1 or 10 and one of the rest, the
+// second continuing the first through the caller's records.
 TEST(Noise, StreamsContinueAcrossCalls) {
-  using Fill = std::function<V(int32_t n, int32_t seed, NoiseState&, GaussSpare&, BinomialCache&)>;
-  const std::vector<std::pair<std::string, Fill>> fills = {
-      {"white", [](int32_t n, int32_t sd, NoiseState& s, GaussSpare&, BinomialCache&) { return White(n, 2, sd, s); }},
-      {"gauss", [](int32_t n, int32_t sd, NoiseState& s, GaussSpare& g, BinomialCache&) { return GaussV(n, 1.5, sd, s, g); }},
-      {"gamma", [](int32_t n, int32_t sd, NoiseState& s, GaussSpare&, BinomialCache&) { return GammaV(n, 9, sd, s); }},
-      {"poisson", [](int32_t n, int32_t sd, NoiseState& s, GaussSpare&, BinomialCache&) { return PoissonV(n, 30, sd, s); }},
-      {"binomial", [](int32_t n, int32_t sd, NoiseState& s, GaussSpare&, BinomialCache& c) { return BinomialV(n, 60, 0.6, sd, s, c); }},
-  };
-  for (const auto& [name, fill] : fills) {
+  for (const auto& [kind, a, p] : std::vector<std::tuple<std::string, double, double>>{
+           {"white", 2, 0}, {"gauss", 1.5, 0}, {"gamma", 9, 0}, {"poisson", 30, 0}, {"binomial", 60, 0.6}}) {
     for (int32_t split : {1, 10}) {
-      NoiseState s{};
-      GaussSpare g{};
-      BinomialCache c{};
-      const V whole = fill(25, 4321, s, g, c);
-      V parts = fill(split, 4321, s, g, c);
-      const V rest = fill(25 - split, -1, s, g, c);
+      Rec r;
+      const V whole = Noise(kind, 25, a, 4321, r, p).y;
+      V parts = Noise(kind, split, a, 4321, r, p).y;
+      const V rest = Noise(kind, 25 - split, a, -1, r, p).y;
       parts.insert(parts.end(), rest.begin(), rest.end());
-      EXPECT_EQ(parts, whole) << name << " " << split;
+      EXPECT_EQ(parts, whole) << kind << " " << split;
     }
   }
   // A seed of 0 continues too; Gauss reseeds only above 0, clearing the spare.
-  NoiseState s{};
-  GaussSpare g{};
-  const V first = GaussV(1, 1, 8, s, g);
-  const V kept = GaussV(1, 1, 0, s, g);
-  NoiseState s2{};
-  GaussSpare g2{1, 99.0};
-  EXPECT_EQ(GaussV(1, 1, 8, s2, g2), first);
-  NoiseState s3{};
-  GaussSpare g3{};
-  EXPECT_EQ(GaussV(2, 1, 8, s3, g3), (V{first[0], kept[0]}));
+  Rec r, cleared{{}, {1, 99.0}};
+  const V pair = Samples("gauss", 2, 1, 8);
+  EXPECT_EQ(Noise("gauss", 1, 1, 8, r).y[0], pair[0]);
+  EXPECT_EQ(Noise("gauss", 1, 1, 0, r).y[0], pair[1]);
+  EXPECT_EQ(Noise("gauss", 1, 1, 8, cleared).y[0], pair[0]);
 }
 
 // Each permutation of n as an index into n!, via its Lehmer code.
@@ -282,66 +244,68 @@ int PermIndex(const std::vector<int32_t>& p) {
   return idx;
 }
 
+// A riffle of data 0.5, 1.5, ... through one of the entries: kind "dbl",
+// "cdb", "int" or "num"; mode -1 calls the older entry. The indices, with the
+// data checked against them.
+struct Perm {
+  int32_t code;
+  std::vector<int32_t> idx;
+};
+Perm RiffleCall(const std::string& kind, int32_t n, int32_t seed, int mode) {
+  V d(n);
+  std::iota(d.begin(), d.end(), 0.5);
+  F64 dd(d);
+  std::vector<cx> c(n);
+  for (int32_t i = 0; i < n; ++i) c[i] = {d[i], -d[i]};
+  Cx cd(c);
+  std::vector<int32_t> iv(n);
+  std::iota(iv.begin(), iv.end(), 100);
+  I32 id(iv), idx{9}, num{9};
+  NoiseState s{};
+  const uint32_t m = mode < 0 ? 0 : mode;
+  const bool old = mode < 0;
+  int32_t code;
+  if (kind == "dbl") code = old ? RiffleArrayDBL_head(dd.Handle(), idx.Handle(), seed, &s) : RiffleArrayDBL2012_head(dd.Handle(), idx.Handle(), seed, &s, m);
+  else if (kind == "cdb") code = old ? RiffleArrayCDB_head(cd.Handle(), idx.Handle(), seed, &s) : RiffleArrayCDB2012_head(cd.Handle(), idx.Handle(), seed, &s, m);
+  else if (kind == "int") code = old ? RiffleArrayInt_head(id.Handle(), idx.Handle(), seed, &s) : RiffleArrayInt2012_head(id.Handle(), idx.Handle(), seed, &s, m);
+  else code = old ? RiffleIntNum_head(num.Handle(), n, seed, &s) : RiffleIntNum2012_head(num.Handle(), n, seed, &s, m);
+  if (kind == "num") return {code, num.Values()};
+  const auto p = idx.Values();
+  for (int32_t i = 0; i < static_cast<int32_t>(p.size()); ++i) {
+    if (kind == "dbl") EXPECT_EQ(dd.At(i), d[p[i]]);
+    if (kind == "cdb") EXPECT_EQ(cd.At(i).im, -d[p[i]]);
+    if (kind == "int") EXPECT_EQ(id.At(i), 100 + p[i]);
+  }
+  return {code, p};
+}
+
 TEST(Noise, RifflesPermuteWithTheExactDistributionOfTheirMode) {
-  // Mode 0 swaps i with j uniform over all n: enumerate the n^n paths.
-  constexpr int n = 3, kFact = 6, kCalls = 30000;
+  // Mode 0 swaps each i with j uniform over all n: enumerate the n^n paths.
+  constexpr int n = 3, kFact = 6, kSeeds = 30000;
   std::vector<LD> classic(kFact, 0);
   for (int path = 0; path < 27; ++path) {
     std::vector<int32_t> p{0, 1, 2};
     for (int i = 0, c = path; i < n; ++i, c /= n) std::swap(p[i], p[c % n]);
     classic[PermIndex(p)] += 1.0L / 27;
   }
-  for (uint32_t mode : {0u, 1u, 7u}) {
-    NoiseState s{};
+  for (int mode : {0, 1, 7}) {
     V idx;
-    for (int k = 0; k < kCalls; ++k) {
-      I32 out;
-      ASSERT_EQ(RiffleIntNum2012_head(out.Handle(), n, k + 1, &s, mode), 0);
-      idx.push_back(PermIndex(out.Values()));
-    }
+    for (int k = 1; k <= kSeeds; ++k) idx.push_back(PermIndex(RiffleCall("num", n, k, mode).idx));
     ExpectChiSquare(idx, [&](int k) { return mode == 0 ? classic[k] : 1.0L / kFact; }, kFact - 1,
                     "mode " + std::to_string(mode));
   }
-  // The data follow their indices; the older entries are mode 0.
-  for (uint32_t mode : {0u, 1u}) {
-    const int32_t m = 9;
-    std::vector<double> d(m);
-    std::iota(d.begin(), d.end(), 0.5);
-    F64 dd(d);
-    Cx cd{std::vector<cx>(m)};
-    I32 id(std::vector<int32_t>(m, 0)), ix, iy, iz, iw;
-    NoiseState s1{}, s2{}, s3{}, s4{};
-    ASSERT_EQ(RiffleArrayDBL2012_head(dd.Handle(), ix.Handle(), 5, &s1, mode), 0);
-    ASSERT_EQ(RiffleArrayCDB2012_head(cd.Handle(), iy.Handle(), 5, &s2, mode), 0);
-    ASSERT_EQ(RiffleArrayInt2012_head(id.Handle(), iz.Handle(), 5, &s3, mode), 0);
-    ASSERT_EQ(RiffleIntNum2012_head(iw.Handle(), m, 5, &s4, mode), 0);
-    const auto p = ix.Values();
-    std::vector<int32_t> sorted = p;
+  // Every entry gives the same permutation; the older entries are mode 0.
+  for (int mode : {0, 1}) {
+    const auto p = RiffleCall("num", 9, 5, mode).idx;
+    auto sorted = p;
     std::sort(sorted.begin(), sorted.end());
-    std::vector<int32_t> ident(m);
-    std::iota(ident.begin(), ident.end(), 0);
-    EXPECT_EQ(sorted, ident);
-    EXPECT_EQ(iy.Values(), p);
-    EXPECT_EQ(iz.Values(), p);
-    EXPECT_EQ(iw.Values(), p);
-    for (int32_t i = 0; i < m; ++i) EXPECT_EQ(dd.At(i), p[i] + 0.5);
-    if (mode == 0) {
-      I32 a, b, c, w;
-      F64 d2(d);
-      Cx c2{std::vector<cx>(m)};
-      I32 i2(std::vector<int32_t>(m, 0));
-      NoiseState t1{}, t2{}, t3{}, t4{};
-      RiffleArrayDBL_head(d2.Handle(), a.Handle(), 5, &t1);
-      RiffleArrayCDB_head(c2.Handle(), b.Handle(), 5, &t2);
-      RiffleArrayInt_head(i2.Handle(), c.Handle(), 5, &t3);
-      RiffleIntNum_head(w.Handle(), m, 5, &t4);
-      for (const auto* h : {&a, &b, &c, &w}) EXPECT_EQ(h->Values(), p);
+    for (int32_t i = 0; i < 9; ++i) EXPECT_EQ(sorted[i], i);
+    for (const char* kind : {"dbl", "cdb", "int", "num"}) {
+      EXPECT_EQ(RiffleCall(kind, 9, 5, mode).idx, p) << kind;
+      if (mode == 0) EXPECT_EQ(RiffleCall(kind, 9, 5, -1).idx, p) << kind;
     }
   }
-  I32 one;
-  NoiseState s{};
-  ASSERT_EQ(RiffleIntNum2012_head(one.Handle(), 1, 3, &s, 1), 0);
-  EXPECT_EQ(one.Values(), std::vector<int32_t>{0});
+  EXPECT_EQ(RiffleCall("num", 1, 3, 1).idx, std::vector<int32_t>{0});
 }
 
 // Inverse DFT of the flat spectrum with the reference's 15-bit phases.
@@ -393,91 +357,52 @@ TEST(Noise, PeriodNoiseInTheArena) {
 // The checks in their order, each emptying the output.
 TEST(Noise, CodesInTheirOrder) {
   const double nan = std::nan("");
-  struct Case {
-    std::string what;
-    std::function<int32_t(F64ArrayHdl)> call;
-    int32_t code;
-  };
-  const auto white_ = [](int32_t n) {
-    return [n](F64ArrayHdl o) mutable { double a = 1; int32_t sd = 1, e = 1; NoiseState s{}; white(o, &n, &a, &sd, &e, &s); return e; };
-  };
-  const auto gauss_ = [](int32_t n) {
-    return [n](F64ArrayHdl o) mutable { double a = 1; int32_t sd = 1, e = 1; NoiseState s{}; GaussSpare g{}; Gauss(o, &n, &a, &sd, &e, &s, &g); return e; };
-  };
-  const auto period_ = [](int32_t n) {
-    return [n](F64ArrayHdl o) mutable { double a = 1; int32_t sd = 1, e = 1; NoiseState s{}; PeriodNoise(&n, &a, &sd, o, &e, &s); return e; };
-  };
-  const auto gamma_ = [](int32_t n, int32_t order) {
-    return [=](F64ArrayHdl o) { NoiseState s{}; return GammaNoiseH(o, n, order, 1, &s); };
-  };
-  const auto poisson_ = [](int32_t n, double mean) {
-    return [=](F64ArrayHdl o) { NoiseState s{}; return PoissonNoiseH(o, n, mean, 1, &s); };
-  };
-  const std::vector<Case> cases = {
-      {"white n 0", white_(0), -20003},        {"gauss n -1", gauss_(-1), -20003},
-      {"period n 0", period_(0), -20003},      {"gamma order 0 n 0", gamma_(0, 0), -20061},
-      {"gamma n 0", gamma_(0, 3), -20003},     {"poisson mean 0 n 0", poisson_(0, 0), -20061},
-      {"poisson nan", poisson_(5, nan), -20061}, {"poisson inf", poisson_(5, INFINITY), -20061},
-      {"poisson n 0", poisson_(0, 2), -20003},
-  };
-  for (const auto& c : cases) {
-    F64 out{1, 2};
-    EXPECT_EQ(c.call(out.Handle()), c.code) << c.what;
-    EXPECT_EQ(out.Count(), 0) << c.what;
+  const std::vector<std::tuple<std::string, int32_t, double, double, int32_t>> cases = {
+      {"white", 0, 1, 0, -20003},      {"gauss", -1, 1, 0, -20003},     {"period", 0, 1, 0, -20003},
+      {"gamma", 0, 0, 0, -20061},      {"gamma", 0, 3, 0, -20003},      {"poisson", 0, 0, 0, -20061},
+      {"poisson", 5, nan, 0, -20061},  {"poisson", 5, INFINITY, 0, -20061}, {"poisson", 0, 2, 0, -20003},
+      {"binomial", 0, -1, 0.5, -20061}, {"binomial", 0, 5, 1.5, -20061}, {"binomial", 0, 5, nan, -20061},
+      {"binomial", 0, 5, -0.1, -20061}, {"binomial", 0, 5, 0.5, -20003}};
+  for (const auto& [kind, n, a, p, code] : cases) {
+    Rec r;
+    const Res res = Noise(kind, n, a, 1, r, p);
+    EXPECT_EQ(res.code, code) << kind << " " << n << " " << a << " " << p;
+    EXPECT_EQ(res.ret, kind == "white" || kind == "gauss" || kind == "period" ? 0 : code) << kind;
+    EXPECT_TRUE(res.y.empty()) << kind;
   }
-  const std::vector<std::tuple<int32_t, int32_t, double, int32_t>> binomial = {
-      {0, -1, 0.5, -20061}, {0, 5, 1.5, -20061}, {0, 5, -0.1, -20061}, {0, 5, nan, -20061}, {0, 5, 0.5, -20003}};
-  for (const auto& [n, trials, p, code] : binomial) {
-    U32 out{1, 2};
-    NoiseState s{};
-    BinomialCache c{};
-    EXPECT_EQ(BinomialNoiseH(out.Handle(), n, trials, p, 1, &s, &c), code) << trials << " " << p;
-    EXPECT_EQ(out.Count(), 0);
+  for (const char* kind : {"dbl", "cdb", "int", "num"}) {
+    const Perm p = RiffleCall(kind, 0, 1, 0);
+    EXPECT_EQ(p.code, -20003) << kind;
+    EXPECT_TRUE(p.idx.empty()) << kind;
   }
-  F64 empty;
-  I32 idx{4, 4}, num{4};
-  NoiseState s{};
-  EXPECT_EQ(RiffleArrayDBL2012_head(empty.Handle(), idx.Handle(), 1, &s, 0), -20003);
-  EXPECT_EQ(idx.Count(), 0);
-  EXPECT_EQ(RiffleIntNum_head(num.Handle(), 0, 1, &s), -20003);
-  EXPECT_EQ(num.Count(), 0);
 }
 
 TEST(Noise, HostResizeFailuresEmptyTheOutputs) {
-  NoiseState s{};
-  GaussSpare g{};
-  BinomialCache c{};
-  const std::vector<std::pair<std::string, std::function<int32_t(F64ArrayHdl, int32_t*)>>> formA = {
-      {"white", [&](F64ArrayHdl o, int32_t* e) { int32_t n = 5, sd = 1; double a = 1; return white(o, &n, &a, &sd, e, &s); }},
-      {"gauss", [&](F64ArrayHdl o, int32_t* e) { int32_t n = 5, sd = 1; double a = 1; return Gauss(o, &n, &a, &sd, e, &s, &g); }},
-      {"period", [&](F64ArrayHdl o, int32_t* e) { int32_t n = 5, sd = 1; double a = 1; return PeriodNoise(&n, &a, &sd, o, e, &s); }},
-  };
-  for (const auto& [name, f] : formA) {
-    F64 out{1};
-    int32_t err = 0;
-    const int made = RunFailingEachResize([&] { return f(out.Handle(), &err); }, [&](int, int32_t r) {
-      EXPECT_NE(r, 0) << name;
-      EXPECT_EQ(err, -20001) << name;
-      EXPECT_EQ(out.Count(), 0) << name;
+  for (const char* kind : {"white", "gauss", "period", "gamma", "poisson", "binomial"}) {
+    Rec r;
+    Res last;
+    const bool formA = std::string(kind) == "white" || std::string(kind) == "gauss" || std::string(kind) == "period";
+    F64 out{7};
+    U32 bin{7};
+    const auto call = [&] { last = NoiseInto(out, bin, kind, 5, 8, 1, r, 0.5); return last.ret; };
+    const int made = RunFailingEachResize(call, [&](int, int32_t ret) {
+      EXPECT_EQ(last.code, -20001) << kind;
+      EXPECT_TRUE(formA ? ret != 0 : ret == -20001) << kind;
+      EXPECT_TRUE(last.y.empty()) << kind;
     });
-    EXPECT_EQ(made, 1) << name;
+    EXPECT_EQ(made, 1) << kind;
   }
-  const auto expectB = [](const std::string& name, const std::function<int32_t()>& call,
-                          const std::vector<std::function<int32_t()>>& counts) {
-    RunFailingEachResize(call, [&](int, int32_t r) {
-      EXPECT_EQ(r, -20001) << name;
-      for (const auto& count : counts) EXPECT_EQ(count(), 0) << name;
-    });
-  };
-  F64 o1, o2, data{1, 2, 3};
-  U32 o3;
+  F64 data{1, 2, 3};
   I32 idx, num;
-  expectB("gamma", [&] { return GammaNoiseH(o1.Handle(), 4, 8, 1, &s); }, {[&] { return o1.Count(); }});
-  expectB("poisson", [&] { return PoissonNoiseH(o2.Handle(), 4, 20, 1, &s); }, {[&] { return o2.Count(); }});
-  expectB("binomial", [&] { return BinomialNoiseH(o3.Handle(), 4, 30, 0.5, 1, &s, &c); }, {[&] { return o3.Count(); }});
-  expectB("riffle", [&] { return RiffleArrayDBL2012_head(data.Handle(), idx.Handle(), 1, &s, 1); },
-          {[&] { return idx.Count(); }, [&] { return data.Count(); }});
-  expectB("riffle number", [&] { return RiffleIntNum2012_head(num.Handle(), 4, 1, &s, 1); }, {[&] { return num.Count(); }});
+  NoiseState s{};
+  RunFailingEachResize([&] { return RiffleArrayDBL2012_head(data.Handle(), idx.Handle(), 1, &s, 1); }, [&](int, int32_t ret) {
+    EXPECT_EQ(ret, -20001);
+    EXPECT_EQ(idx.Count() + data.Count(), 0);
+  });
+  RunFailingEachResize([&] { return RiffleIntNum2012_head(num.Handle(), 4, 1, &s, 1); }, [&](int, int32_t ret) {
+    EXPECT_EQ(ret, -20001);
+    EXPECT_EQ(num.Count(), 0);
+  });
 }
 
 }  // namespace

@@ -94,9 +94,6 @@ TEST(Noise, UniformStreamAndWordsMatchTheReference) {
     EXPECT_EQ((std::vector<int32_t>{r.s.s1, r.s.s2, r.s.s3}), Gold().words.at(seed)) << seed;
   }
   EXPECT_EQ(Samples("white", 5, 3, 0), V(5, -3.0));  // a record of zeros sticks at 0
-  Rec one;
-  Noise("white", 1, 1, 1, one);
-  EXPECT_EQ((std::vector<int32_t>{one.s.s1, one.s.s2, one.s.s3}), (std::vector<int32_t>{171, 8191 * 172 % 30307, 170}));
 }
 
 // Kolmogorov-Smirnov distance of samples from a CDF.
@@ -272,9 +269,8 @@ Perm RiffleCall(const std::string& kind, int32_t n, int32_t seed, int mode) {
   if (kind == "num") return {code, num.Values()};
   const auto p = idx.Values();
   for (int32_t i = 0; i < static_cast<int32_t>(p.size()); ++i) {
-    if (kind == "dbl") EXPECT_EQ(dd.At(i), d[p[i]]);
-    if (kind == "cdb") EXPECT_EQ(cd.At(i).im, -d[p[i]]);
-    if (kind == "int") EXPECT_EQ(id.At(i), 100 + p[i]);
+    const double got = kind == "dbl" ? dd.At(i) : kind == "cdb" ? -cd.At(i).im : id.At(i) - 99.5;
+    EXPECT_EQ(got, d[p[i]]) << kind << " " << i;
   }
   return {code, p};
 }
@@ -302,55 +298,39 @@ TEST(Noise, RifflesPermuteWithTheExactDistributionOfTheirMode) {
     for (int32_t i = 0; i < 9; ++i) EXPECT_EQ(sorted[i], i);
     for (const char* kind : {"dbl", "cdb", "int", "num"}) {
       EXPECT_EQ(RiffleCall(kind, 9, 5, mode).idx, p) << kind;
-      if (mode == 0) EXPECT_EQ(RiffleCall(kind, 9, 5, -1).idx, p) << kind;
+      if (mode == 0) {
+        EXPECT_EQ(RiffleCall(kind, 9, 5, -1).idx, p) << kind;
+      }
     }
   }
   EXPECT_EQ(RiffleCall("num", 1, 3, 1).idx, std::vector<int32_t>{0});
 }
 
-// Inverse DFT of the flat spectrum with the reference's 15-bit phases.
+// Inverse DFT of the flat spectrum with the reference's 15-bit phases, with
+// scratch from the heap, from the arena, and from an arena too small (-20001).
 TEST(Noise, PeriodNoiseIsTheInverseTransformOfItsSpectrum) {
   const auto& ks = Gold().int15.at(12345);
   for (int32_t n : {1, 2, 7, 8, 30}) {
-    int32_t m = n, seed = 12345, err = 1;
-    double amp = 1.5;
-    NoiseState s{};
-    F64 out{3};
-    ASSERT_EQ(PeriodNoise(&m, &amp, &seed, out.Handle(), &err, &s), 0);
-    ASSERT_EQ(err, 0);
-    ASSERT_EQ(out.Count(), n);
-    const int half = n % 2 == 0 ? n / 2 - 1 : (n - 1) / 2;
+    const V y = Samples("period", n, 1.5, 12345);
+    ASSERT_EQ(y.size(), static_cast<size_t>(n));
     for (int t = 0; t < n; ++t) {
-      LD sum = 0;  // bins k and n-k together: 2 mag cos(angle + 2 pi k t / n)
-      for (int k = 1; k <= half; ++k)
-        sum += 2 * (n * amp * 0.5L) * std::cos(ks[k - 1] + 2 * 3.14159265358979323846L * k * t / n);
-      EXPECT_NEAR(out.At(t), static_cast<double>(sum / n), 64 * kEps * amp * n) << n << " " << t;
+      LD sum = 0;  // bins k and n-k together: 2 mag cos(angle + 2 pi k t / n), mag = 1.5 n / 2
+      for (int k = 1; 2 * k < n; ++k) sum += 1.5L * n * std::cos(ks[k - 1] + 2 * 3.14159265358979323846L * k * t / n);
+      EXPECT_NEAR(y[t], static_cast<double>(sum / n), 64 * kEps * n) << n << " " << t;
     }
   }
-}
-
-// Scratch from the arena: the same samples, and -20001 when it is too small.
-TEST(Noise, PeriodNoiseInTheArena) {
-  const auto run = [](int32_t* err) {
-    int32_t n = 64, seed = 3;
-    double amp = 1;
-    NoiseState s{};
-    F64 out;
-    PeriodNoise(&n, &amp, &seed, out.Handle(), err, &s);
-    return out.Values();
-  };
-  int32_t err = 1;
-  const V heap = run(&err);
+  const V heap = Samples("period", 64, 1, 3);
   for (uint32_t size : {1u << 16, 100u}) {
     ErrorCluster cl{0, 0};
     InitializeAnalysisWorkspaceH(size, &cl);
     EnableAnalysisWorkspaceH(&cl);
-    const V arena = run(&err);
+    Rec r;
+    const Res arena = Noise("period", 64, 1, 3, r);
     DisableAnalysisWorkspaceH(&cl);
     UninitializeAnalysisWorkspaceH(&cl);
     EXPECT_EQ(cl.status, 0);
-    EXPECT_EQ(err, size == 100u ? -20001 : 0);
-    EXPECT_EQ(arena, size == 100u ? V{} : heap);
+    EXPECT_EQ(arena.code, size == 100u ? -20001 : 0);
+    EXPECT_EQ(arena.y, size == 100u ? V{} : heap);
   }
 }
 

@@ -70,9 +70,9 @@ ErrorCode WhiteNoise(f64* y, int32 n, f64 amp, int32 seed, NoiseState* state) {
 ErrorCode GaussNoise(f64* y, int32 n, f64 sd, int32 seed, NoiseState* state, GaussSpare* spare) {
   if (n < 1) return TSM_ERR_EMPTY;
   NoiseSource src(state, seed > 0 ? seed : -1);
-  int32 valid = spare != nullptr ? spare->valid : 0;
-  f64 kept = spare != nullptr ? spare->value : 0.0;
-  if (seed > 0) valid = 0, kept = 0.0;
+  const bool keep = spare != nullptr && seed <= 0;
+  int32 valid = keep ? spare->valid : 0;
+  f64 kept = keep ? spare->value : 0.0;
   for (int32 i = 0; i < n; ++i) {
     if (valid == 0) {
       f64 a = 0, b = 0, r = 0;

@@ -73,6 +73,19 @@ typedef struct ReferenceLevels { double highRef; double midRef; double lowRef; u
 /* How the state levels are found. method: 0 histogram, 1 minimum and maximum,
  * 2 histogram where populated, else the extremes. bins: histogram bins. */
 typedef struct LevelMethod { uint32_t method; int32_t bins; } LevelMethod;
+
+/* The random source's three generator words, kept by the caller between
+ * calls: the same record passed again continues one stream. */
+typedef struct NoiseState { int32_t s1; int32_t s2; int32_t s3; } NoiseState;
+
+/* The second deviate of a Gaussian pair, kept for the next output. */
+typedef struct GaussSpare { int32_t valid; double value; } GaussSpare;
+
+/* Set-up of the binomial rejection method for the last trials and
+ * probability, so that repeated calls skip the logarithms. */
+typedef struct BinomialCache {
+  double pold; double pc; double plog; double pclog; double en; double oldg; int32_t nold;
+} BinomialCache;
 #pragma pack(pop)
 
 /* Histogram counters kept between calls of a measurement entry in a variable

@@ -1,6 +1,6 @@
 /* Automatically generated from entries/exports.table, do not edit.
  * Regenerate: cmake -P tools/gen_exports.cmake
- * 186 exports. Included by tsmath.h inside its extern "C" block. */
+ * 200 exports. Included by tsmath.h inside its extern "C" block. */
 #ifndef TSMATH_EXPORTS_H
 #define TSMATH_EXPORTS_H
 
@@ -35,6 +35,22 @@ TSM_API int32_t AperiodTriangleH(F64ArrayHdl xy, int32_t n, double amp, double d
 TSM_API int32_t GaussMonopulseH(F64ArrayHdl xy, int32_t n, double dt, double delay, double fc, double amp);
 TSM_API int32_t GaussPulseH(F64ArrayHdl xy, int32_t n, double amp, double delay, double dt, double fc, double bw, double att);
 TSM_API int32_t PeriodicSincH(F64ArrayHdl xy, int32_t n, double amp, int32_t order, double dt, double delay);
+
+/* Noise generators */
+TSM_API int32_t white(F64ArrayHdl out, int32_t* n, double* amp, int32_t* seed, int32_t* err, NoiseState* state);
+TSM_API int32_t Gauss(F64ArrayHdl out, int32_t* n, double* sd, int32_t* seed, int32_t* err, NoiseState* state, GaussSpare* spare);
+TSM_API int32_t PeriodNoise(int32_t* n, double* amp, int32_t* seed, F64ArrayHdl out, int32_t* err, NoiseState* state);
+TSM_API int32_t BinomialNoiseH(U32ArrayHdl out, int32_t n, int32_t trials, double p, int32_t seed, NoiseState* state, BinomialCache* cache);
+TSM_API int32_t GammaNoiseH(F64ArrayHdl out, int32_t n, int32_t order, int32_t seed, NoiseState* state);
+TSM_API int32_t PoissonNoiseH(F64ArrayHdl out, int32_t n, double mean, int32_t seed, NoiseState* state);
+TSM_API int32_t RiffleArrayDBL2012_head(F64ArrayHdl data, I32ArrayHdl indices, int32_t seed, NoiseState* state, uint32_t mode);
+TSM_API int32_t RiffleArrayCDB2012_head(CxArrayHdl data, I32ArrayHdl indices, int32_t seed, NoiseState* state, uint32_t mode);
+TSM_API int32_t RiffleArrayInt2012_head(I32ArrayHdl data, I32ArrayHdl indices, int32_t seed, NoiseState* state, uint32_t mode);
+TSM_API int32_t RiffleIntNum2012_head(I32ArrayHdl out, int32_t n, int32_t seed, NoiseState* state, uint32_t mode);
+TSM_API int32_t RiffleArrayDBL_head(F64ArrayHdl data, I32ArrayHdl indices, int32_t seed, NoiseState* state);
+TSM_API int32_t RiffleArrayCDB_head(CxArrayHdl data, I32ArrayHdl indices, int32_t seed, NoiseState* state);
+TSM_API int32_t RiffleArrayInt_head(I32ArrayHdl data, I32ArrayHdl indices, int32_t seed, NoiseState* state);
+TSM_API int32_t RiffleIntNum_head(I32ArrayHdl out, int32_t n, int32_t seed, NoiseState* state);
 
 /* Descriptive statistics */
 TSM_API int32_t Mean_head(F64ArrayHdl x, double* mean, int32_t* err);

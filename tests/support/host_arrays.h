@@ -23,6 +23,7 @@ struct BlockType;
 template <> struct BlockType<F64Array> { using Elem = double; static constexpr int32_t kType = TSM_TYPE_F64; };
 template <> struct BlockType<I32Array> { using Elem = int32_t; static constexpr int32_t kType = TSM_TYPE_I32; };
 template <> struct BlockType<U8Array> { using Elem = uint8_t; static constexpr int32_t kType = TSM_TYPE_U8; };
+template <> struct BlockType<U32Array> { using Elem = uint32_t; static constexpr int32_t kType = TSM_TYPE_U32; };
 template <> struct BlockType<CxArray> { using Elem = cx; static constexpr int32_t kType = TSM_TYPE_CX128; };
 template <> struct BlockType<GenHistIntervalArray> {
   using Elem = GenHistInterval;
@@ -80,6 +81,7 @@ class HostArray {
 using F64 = HostArray<F64Array>;
 using I32 = HostArray<I32Array>;
 using Cx = HostArray<CxArray>;
+using U32 = HostArray<U32Array>;
 using Intervals = HostArray<GenHistIntervalArray>;
 
 // Runs `call` once per resize it makes, failing the 1st, 2nd, ... resize in

@@ -245,6 +245,34 @@ void SpecialValues() {
   std::printf("\n");
 }
 
+// 20000 samples of Gaussian noise (sd 1) in bins of 0.5 against the counts
+// its density predicts.
+void GaussianHistogram() {
+  int32_t n = 20000, seed = 17, code = 0;
+  double sd = 1.0;
+  NoiseState state{0, 0, 0};
+  GaussSpare spare{0, 0.0};
+  auto out = static_cast<F64ArrayHdl>(tsrt_new_array(TSM_TYPE_F64, 0, nullptr));
+  ENTRY(Gauss)(out, &n, &sd, &seed, &code, &state, &spare);
+  std::printf("  Gaussian noise, %d samples, sd 1 (Gauss code %d): counts per bin against the density\n",
+              CountOf(out), code);
+  const double width = 0.5;
+  std::vector<int> counts(12, 0);
+  for (int32_t i = 0; i < CountOf(out); ++i) {
+    const int b = static_cast<int>(std::floor((F64At(out, i) + 3.0) / width));
+    if (b >= 0 && b < 12) ++counts[b];
+  }
+  for (int b = 0; b < 12; ++b) {
+    const double lo = -3.0 + b * width, hi = lo + width;
+    const double expected = n * 0.5 * (std::erf(hi / M_SQRT2) - std::erf(lo / M_SQRT2));
+    std::printf("    [%4.1f, %4.1f)  %5d  expected %7.1f  ", lo, hi, counts[b], expected);
+    for (int k = 0; k < counts[b] / 100; ++k) std::putchar('#');
+    std::putchar('\n');
+  }
+  std::printf("\n");
+  tsrt_dispose(out);
+}
+
 }  // namespace
 
 int main(int argc, char** argv) {
@@ -346,6 +374,7 @@ int main(int argc, char** argv) {
   PeriodicAnalysis();
   PulseTrain();
   SpecialValues();
+  GaussianHistogram();
 
   ENTRY(DisableAnalysisWorkspaceH)(&err);
   ENTRY(UninitializeAnalysisWorkspaceH)(&err);

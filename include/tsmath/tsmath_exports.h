@@ -1,6 +1,6 @@
 /* Automatically generated from entries/exports.table, do not edit.
  * Regenerate: cmake -P tools/gen_exports.cmake
- * 200 exports. Included by tsmath.h inside its extern "C" block. */
+ * 201 exports. Included by tsmath.h inside its extern "C" block. */
 #ifndef TSMATH_EXPORTS_H
 #define TSMATH_EXPORTS_H
 
@@ -231,5 +231,8 @@ TSM_API void TS_Elliptic2(double m, double phi, double* result);
 TSM_API void TS_Elliptic2_85(double m, double phi, double* result, int32_t mode);
 TSM_API void TS_EllipticJ(double u, double m, double* sn, double* cn, double* dn, double* phi);
 TSM_API void TS_Diln(double x, double* result);
+
+/* Special functions: Bessel family */
+TSM_API void TS_Airy(double x, double* ai, double* aip, double* bi, double* bip);
 
 #endif

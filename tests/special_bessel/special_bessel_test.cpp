@@ -1,0 +1,134 @@
+// The Bessel-family entries against mpmath values made by
+// tools/golden/special_bessel_golden.py (tests/data/special_bessel_*.txt), and
+// the defined values at the edges of their domains.
+//
+// Errors are taken relative to each function's envelope: where it oscillates
+// (Airy for x < 0) the modulus sqrt(Ai^2 + Bi^2), so that values near a zero
+// are judged against the size of the wave. Airy's zeta = 2/3 |x|^(3/2) is
+// itself rounded, an error of about zeta eps in the phase or the exponent that
+// no evaluation in doubles avoids: the tolerance grows with it.
+#include <gtest/gtest.h>
+
+#include <cmath>
+#include <cstdio>
+#include <cstdlib>
+#include <fstream>
+#include <functional>
+#include <limits>
+#include <sstream>
+#include <string>
+#include <vector>
+
+#include "tsmath/tsmath.h"
+
+namespace {
+
+constexpr double kEps = 2.220446049250313e-16;
+constexpr double kInf = INFINITY;
+constexpr double kMax = std::numeric_limits<double>::max();
+
+using Row = std::vector<double>;
+
+std::vector<Row> Load(const std::string& name) {
+  std::ifstream in(std::string(TSM_TEST_DATA) + "/special_bessel_" + name + ".txt");
+  std::vector<Row> rows;
+  std::string line;
+  while (std::getline(in, line)) {
+    if (line.empty() || line[0] == '#') continue;
+    std::istringstream words(line);
+    Row r;
+    for (std::string w; words >> w;) r.push_back(std::strtod(w.c_str(), nullptr));
+    rows.push_back(r);
+  }
+  return rows;
+}
+
+// Relative to max(|want|, envelope); results in the subnormal range count
+// their rounding there as one eps.
+double Err(double got, double want, double envelope) {
+  const double s = std::fmax(std::fmax(std::fabs(want), envelope), std::numeric_limits<double>::min() / kEps);
+  return s == 0 ? std::fabs(got) : std::fabs(got - want) / s;
+}
+
+// One golden file: `check` returns the error of one row in units of its own
+// allowance; all must stay at or below 1.
+struct GoldenCase {
+  const char* file;
+  std::function<double(const Row&)> check;
+};
+
+class Golden : public ::testing::TestWithParam<GoldenCase> {};
+
+TEST_P(Golden, MatchesMpmath) {
+  const GoldenCase& c = GetParam();
+  const std::vector<Row> rows = Load(c.file);
+  ASSERT_GT(rows.size(), 500u) << c.file;
+  double worst = 0;
+  for (const Row& r : rows) {
+    const double e = c.check(r);
+    worst = std::fmax(worst, e);
+    EXPECT_LE(e, 1.0) << c.file << " at " << r[0];
+  }
+  std::printf("%-12s %zu cases, worst error %.2f of its allowance\n", c.file, rows.size(), worst);
+}
+
+// 16 eps, plus 2 zeta eps for the rounding of zeta in the phase or the
+// exponential (the functions' own condition number is 3/2 zeta). On
+// (0, 2.09) Ai and Ai' come from the Maclaurin series as c1 f - c2 g, a
+// difference of terms of size Bi/sqrt 3 (Bi'/sqrt 3): that is their scale.
+double AiryError(const Row& r) {
+  const double x = r[0];
+  double v[4];
+  TS_Airy(x, &v[0], &v[1], &v[2], &v[3]);
+  double m = 0, n = 0, ma = 0, na = 0;
+  if (x < 0) {
+    m = ma = std::hypot(r[1], r[3]);
+    n = na = std::hypot(r[2], r[4]);
+  } else if (x < 2.09) {
+    ma = r[3] / std::sqrt(3.0);
+    na = r[4] / std::sqrt(3.0);
+  }
+  const double e = std::fmax(std::fmax(Err(v[0], r[1], ma), Err(v[2], r[3], m)),
+                             std::fmax(Err(v[1], r[2], na), Err(v[3], r[4], n)));
+  const double zeta = 2.0 / 3 * std::pow(std::fabs(x), 1.5);
+  return e / ((16 + 2 * zeta) * kEps);
+}
+
+INSTANTIATE_TEST_SUITE_P(Kernels, Golden, ::testing::Values(GoldenCase{"airy", AiryError}),
+                         [](const auto& info) { return std::string(info.param.file); });
+
+// Exact values and limits: {got, want}; NaN wants NaN.
+void ExpectCases(const std::vector<std::pair<double, double>>& cases) {
+  for (size_t i = 0; i < cases.size(); ++i) {
+    const auto [got, want] = cases[i];
+    if (std::isnan(want)) {
+      EXPECT_TRUE(std::isnan(got)) << "case " << i << " gave " << got;
+    } else {
+      EXPECT_EQ(got, want) << "case " << i;
+    }
+  }
+}
+
+TEST(Airy, Limits) {
+  std::vector<std::pair<double, double>> cases;
+  const std::pair<double, std::vector<double>> table[] = {
+      {NAN, {NAN, NAN, NAN, NAN}},
+      {kInf, {0, 0, kInf, kInf}},
+      {std::nextafter(103.892, kInf), {0, 0, kMax, kMax}},
+      {1e300, {0, 0, kMax, kMax}},
+      {-kInf, {0, NAN, 0, NAN}},
+  };
+  for (const auto& [x, want] : table) {
+    double v[4];
+    TS_Airy(x, &v[0], &v[1], &v[2], &v[3]);
+    for (int k = 0; k < 4; ++k) cases.push_back({v[k], want[k]});
+  }
+  ExpectCases(cases);
+  // Just below the cut the values are still finite and Bi grows without bound.
+  double ai, aip, bi, bip;
+  TS_Airy(103.892, &ai, &aip, &bi, &bip);
+  EXPECT_GT(ai, 0);
+  EXPECT_TRUE(std::isfinite(bi) && bi > 1e300);
+}
+
+}  // namespace

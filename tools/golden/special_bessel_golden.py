@@ -1,0 +1,65 @@
+#!/usr/bin/python3
+"""Golden values for the Bessel-family tests (tests/special_bessel).
+
+mpmath at 40 digits. Arguments are random draws from fixed seeds, log-uniform
+where the range is wide, plus the break points of the kernels and their
+neighbours. Every float64 is written as a hex float (float.hex()).
+
+Regenerate (Debian's python3 with python3-mpmath and python3-numpy):
+    /usr/bin/python3 tools/golden/special_bessel_golden.py tests/data
+
+Files, one case a line, whitespace-separated:
+    special_bessel_airy.txt     x Ai Ai' Bi Bi'
+"""
+import math
+import os
+import sys
+
+import mpmath as mp
+import numpy as np
+
+mp.mp.dps = 40
+rng = np.random.RandomState(20261124)
+
+
+def hx(v):
+    return float(v).hex()
+
+
+def loguni(a, b, n):
+    return [float(v) for v in np.exp(rng.uniform(math.log(a), math.log(b), n))]
+
+
+def around(points):
+    out = []
+    for p in points:
+        out += [math.nextafter(p, -math.inf), p, math.nextafter(p, math.inf)]
+    return out
+
+
+def write(dirname, name, header, rows):
+    with open(os.path.join(dirname, 'special_bessel_%s.txt' % name), 'w') as f:
+        f.write('# %s\n' % header)
+        for r in rows:
+            f.write(' '.join(hx(v) for v in r) + '\n')
+
+
+def airy(dirname):
+    xs = [float(v) for v in rng.uniform(-2.09, 2.09, 1500)]
+    xs += loguni(2.09, 103.892, 1500)
+    xs += [-v for v in loguni(2.09, 200.0, 2000)]
+    xs += around([-2.09, 2.09, 8.3203353, 103.892]) + [0.0]
+    rows = []
+    for x in sorted(v for v in xs if v <= 103.892):  # above: the limits, tested apart
+        m = mp.mpf(x)
+        rows.append([x, mp.airyai(m), mp.airyai(m, 1), mp.airybi(m), mp.airybi(m, 1)])
+    write(dirname, 'airy', 'x Ai Ai\' Bi Bi\'', rows)
+
+
+def main():
+    dirname = sys.argv[1] if len(sys.argv) > 1 else 'tests/data'
+    airy(dirname)
+
+
+if __name__ == '__main__':
+    main()

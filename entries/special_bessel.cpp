@@ -3,11 +3,17 @@
 #include "frame/types.h"
 #include "tsmath/tsmath.h"
 #include "special/airy.h"
+#include "special/kelvin.h"
 
 using namespace tsm;
 
 extern "C" {
 
 void TS_Airy(double x, double* ai, double* aip, double* bi, double* bip) { AiryFunctions(x, ai, aip, bi, bip); }
+
+// Value first, order second, the reverse of the kernels.
+void TS_KelvinI(double x, int32_t n, double* ber, double* bei) { KelvinI(n, x, ber, bei); }
+
+void TS_KelvinK(double x, int32_t n, double* ker, double* kei) { KelvinK(n, x, ker, kei); }
 
 }  // extern "C"

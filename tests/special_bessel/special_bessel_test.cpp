@@ -94,7 +94,27 @@ double AiryError(const Row& r) {
   return e / ((16 + 2 * zeta) * kEps);
 }
 
-INSTANTIATE_TEST_SUITE_P(Kernels, Golden, ::testing::Values(GoldenCase{"airy", AiryError}),
+// 16 eps of the scale of the series terms that cancel: I_n(|x|) for ber and
+// bei, that times (2 + |ln(x/2)| + ln(|n| + x + 2)) for ker and kei (see
+// special/kelvin.cpp); below it, of the modulus.
+double KelvinError(const Row& r) {
+  const int32_t n = static_cast<int32_t>(r[0]);
+  const double x = r[1], in = r[6];
+  double a, b;
+  TS_KelvinI(x, n, &a, &b);
+  const double m = std::fmax(std::hypot(r[2], r[3]), in);
+  double e = std::fmax(Err(a, r[2], m), Err(b, r[3], m));
+  if (x > 0) {
+    TS_KelvinK(x, n, &a, &b);
+    const double k = std::fmax(std::hypot(r[4], r[5]),
+                               (2 + std::fabs(std::log(x / 2)) + std::log(std::abs(n) + x + 2)) * in);
+    e = std::fmax(e, std::fmax(Err(a, r[4], k), Err(b, r[5], k)));
+  }
+  return e / (16 * kEps);
+}
+
+INSTANTIATE_TEST_SUITE_P(Kernels, Golden,
+                         ::testing::Values(GoldenCase{"airy", AiryError}, GoldenCase{"kelvin", KelvinError}),
                          [](const auto& info) { return std::string(info.param.file); });
 
 // Exact values and limits: {got, want}; NaN wants NaN.
@@ -129,6 +149,33 @@ TEST(Airy, Limits) {
   TS_Airy(103.892, &ai, &aip, &bi, &bip);
   EXPECT_GT(ai, 0);
   EXPECT_TRUE(std::isfinite(bi) && bi > 1e300);
+}
+
+TEST(Kelvin, Limits) {
+  constexpr double kQuarterPi = 0.7853981633974483;
+  std::vector<std::pair<double, double>> cases;
+  const struct {
+    double x;
+    int32_t n;
+    double ber, bei, ker, kei;
+  } table[] = {
+      {0, 0, 1, 0, kInf, -kQuarterPi},  // ker_0 has a log singularity, kei_0(0) = -pi/4
+      {0, 3, 0, 0, NAN, NAN},
+      {-1, 0, NAN, NAN, NAN, NAN},  // only ker, kei refuse x < 0: ber, bei not checked here
+      {NAN, 2, NAN, NAN, NAN, NAN},
+  };
+  for (const auto& t : table) {
+    double ber, bei, ker, kei;
+    TS_KelvinI(t.x, t.n, &ber, &bei);
+    TS_KelvinK(t.x, t.n, &ker, &kei);
+    if (t.x >= 0 || std::isnan(t.x)) {
+      cases.push_back({ber, t.ber});
+      cases.push_back({bei, t.bei});
+    }
+    cases.push_back({ker, t.ker});
+    cases.push_back({kei, t.kei});
+  }
+  ExpectCases(cases);
 }
 
 }  // namespace

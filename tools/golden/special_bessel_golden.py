@@ -10,6 +10,7 @@ Regenerate (Debian's python3 with python3-mpmath and python3-numpy):
 
 Files, one case a line, whitespace-separated:
     special_bessel_airy.txt     x Ai Ai' Bi Bi'
+    special_bessel_kelvin.txt   n x ber bei ker kei I_n(|x|)  (ker, kei 0 for x < 0)
 """
 import math
 import os
@@ -56,9 +57,24 @@ def airy(dirname):
     write(dirname, 'airy', 'x Ai Ai\' Bi Bi\'', rows)
 
 
+KELVIN_ORDERS = (0, 1, 2, 3, 4, 5, 7, 10, 20, -1, -2, -3)
+
+
+def kelvin(dirname):
+    rows = []
+    for n in KELVIN_ORDERS:
+        xs = loguni(1e-6, 30.0, 300) + [-v for v in loguni(1e-3, 20.0, 60)] + [1.0, 2.0, 8.0]
+        for x in sorted(xs):
+            m = mp.mpf(x)
+            kk = [mp.ker(n, m), mp.kei(n, m)] if x > 0 else [0, 0]
+            rows.append([n, x, mp.re(mp.ber(n, m)), mp.re(mp.bei(n, m))] + kk + [mp.besseli(n, abs(m))])
+    write(dirname, 'kelvin', 'n x ber bei ker kei I_n(|x|)', rows)
+
+
 def main():
     dirname = sys.argv[1] if len(sys.argv) > 1 else 'tests/data'
     airy(dirname)
+    kelvin(dirname)
 
 
 if __name__ == '__main__':

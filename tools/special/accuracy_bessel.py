@@ -8,9 +8,12 @@ markdown row per kernel: grid, our max and median error, scipy's max and median.
 Errors are relative to the function's envelope: for the oscillating side of
 Airy (x < 0) the modulus sqrt(Ai^2 + Bi^2) (sqrt(Ai'^2 + Bi'^2) for the
 derivatives); on (0, 2.09), where Ai and Ai' are a difference of terms of size
-Bi/sqrt 3, that size.
+Bi/sqrt 3, that size. Kelvin functions: relative to the size of the series
+terms that cancel, I_n(x) for ber, bei and (2 + |ln(x/2)| + ln(n + x + 2)) I_n(x)
+for ker, kei, or the modulus where that is larger; the rows "x <= 10" also give
+the error relative to the modulus itself.
 
-Usage: /usr/bin/python3 tools/special/accuracy_bessel.py build/libtsmath.so
+Usage: /usr/bin/python3 tools/special/accuracy_bessel.py build/libtsmath.so [airy|kelvin ...]
 """
 import ctypes
 import os
@@ -31,6 +34,8 @@ def lib_funcs(path):
     ctypes.CDLL(path.replace('libtsmath.so', 'host/libtsrt.so'), mode=ctypes.RTLD_GLOBAL)
     lib = ctypes.CDLL(path)
     lib.TS_Airy.argtypes = [D, P, P, P, P]
+    lib.TS_KelvinI.argtypes = [D, ctypes.c_int32, P, P]
+    lib.TS_KelvinK.argtypes = [D, ctypes.c_int32, P, P]
     return lib
 
 
@@ -61,10 +66,45 @@ def airy_rows(lib):
               [t[i] for i in small])
 
 
+def kelvin_rows(lib):
+    xs = with_breaks(logspace(1e-8, 30, 10000), [1.0])
+    grids = [('n = 0', [(0, x) for x in xs]),
+             ('n in {1, 2, 3, 5, 10, -1, -4}', [(n, x) for n in (1, 2, 3, 5, 10, -1, -4)
+                                                  for x in xs[::7]])]
+    for label, pts in grids:
+        oi, ti, ok, tk, oir, okr = [], [], [], [], [], []
+        for n, x in pts:
+            m = mp.mpf(x)
+            rb, rc = mp.ber(n, m), mp.bei(n, m)
+            rk, rl = mp.ker(n, m), mp.kei(n, m)
+            i_n = mp.besseli(n, m)
+            si = max(mp.hypot(rb, rc), i_n)
+            sk = max(mp.hypot(rk, rl), (2 + abs(mp.log(m / 2)) + mp.log(abs(n) + m + 2)) * i_n)
+            b, c = call(lib.TS_KelvinI, x, n, outs=2)
+            k, l = call(lib.TS_KelvinK, x, n, outs=2)
+            oi.append(max(err(b, rb, si), err(c, rc, si)))
+            ok.append(max(err(k, rk, sk), err(l, rl, sk)))
+            if x <= 10:
+                oir.append(max(err(b, rb, mp.hypot(rb, rc)), err(c, rc, mp.hypot(rb, rc))))
+                okr.append(max(err(k, rk, mp.hypot(rk, rl)), err(l, rl, mp.hypot(rk, rl))))
+            if n == 0:
+                ti.append(max(err(float(sc.ber(x)), rb, si), err(float(sc.bei(x)), rc, si)))
+                tk.append(max(err(float(sc.ker(x)), rk, sk), err(float(sc.kei(x)), rl, sk)))
+        nan = [float('nan')]
+        grid = '%d (n, x), x log-spaced in [1e-8, 30]' % len(pts)
+        yield row('KelvinI (ber, bei), %s' % label, grid, oi, ti or nan)
+        yield row('KelvinK (ker, kei), %s' % label, grid, ok, tk or nan)
+        yield row('KelvinI, %s, x <= 10, relative to the modulus' % label, 'as above', oir, nan)
+        yield row('KelvinK, %s, x <= 10, relative to the modulus' % label, 'as above', okr, nan)
+
+
 def main():
     lib = lib_funcs(sys.argv[1] if len(sys.argv) > 1 else 'build/libtsmath.so')
-    for r in airy_rows(lib):
-        print(r)
+    which = sys.argv[2:] or ['airy', 'kelvin']
+    for name, rows in (('airy', airy_rows), ('kelvin', kelvin_rows)):
+        if name in which:
+            for r in rows(lib):
+                print(r)
 
 
 if __name__ == '__main__':

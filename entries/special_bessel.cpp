@@ -3,6 +3,7 @@
 #include "frame/types.h"
 #include "tsmath/tsmath.h"
 #include "special/airy.h"
+#include "special/bessel_ik.h"
 #include "special/kelvin.h"
 
 using namespace tsm;
@@ -10,6 +11,8 @@ using namespace tsm;
 extern "C" {
 
 void TS_Airy(double x, double* ai, double* aip, double* bi, double* bip) { AiryFunctions(x, ai, aip, bi, bip); }
+
+void TS_BesselKn(int32_t n, double x, double* result) { *result = BesselK(n, x); }
 
 // Value first, order second, the reverse of the kernels.
 void TS_KelvinI(double x, int32_t n, double* ber, double* bei) { KelvinI(n, x, ber, bei); }

@@ -1,6 +1,6 @@
 // Automatically generated, do not edit.
 // Generator: tools/special/fit_bessel.py (mpmath, 40 digits).
-// Regenerate: /usr/bin/python3 tools/special/fit_bessel.py > special/airy_coefficients.h
+// Regenerate: /usr/bin/python3 tools/special/fit_bessel.py airy > special/airy_coefficients.h
 // Chebyshev sets hold sum c_k T_k(t), t in [-1, 1], c_0 not halved, lowest first.
 #pragma once
 

@@ -113,8 +113,18 @@ double KelvinError(const Row& r) {
   return e / (16 * kEps);
 }
 
+// Relative, 16 eps for K0 and K1 and a few more roundings per step of the
+// recurrence, which is stable upward.
+double KnError(const Row& r) {
+  const int32_t n = static_cast<int32_t>(r[0]);
+  double v;
+  TS_BesselKn(n, r[1], &v);
+  return Err(v, r[2], 0) / ((16 + std::abs(n)) * kEps);
+}
+
 INSTANTIATE_TEST_SUITE_P(Kernels, Golden,
-                         ::testing::Values(GoldenCase{"airy", AiryError}, GoldenCase{"kelvin", KelvinError}),
+                         ::testing::Values(GoldenCase{"airy", AiryError}, GoldenCase{"kelvin", KelvinError},
+                                           GoldenCase{"kn", KnError}),
                          [](const auto& info) { return std::string(info.param.file); });
 
 // Exact values and limits: {got, want}; NaN wants NaN.
@@ -149,6 +159,17 @@ TEST(Airy, Limits) {
   TS_Airy(103.892, &ai, &aip, &bi, &bip);
   EXPECT_GT(ai, 0);
   EXPECT_TRUE(std::isfinite(bi) && bi > 1e300);
+}
+
+TEST(BesselKn, Limits) {
+  auto k = [](int32_t n, double x) {
+    double v;
+    TS_BesselKn(n, x, &v);
+    return v;
+  };
+  ExpectCases({{k(0, 0), kInf}, {k(3, 0), kInf}, {k(1, -1), NAN}, {k(2, NAN), NAN}, {k(0, kInf), 0},
+               {k(200, 1e-3), kInf},  // overflow in the recurrence
+               {k(-4, 3.5), k(4, 3.5)}});
 }
 
 TEST(Kelvin, Limits) {

@@ -11,6 +11,7 @@ Regenerate (Debian's python3 with python3-mpmath and python3-numpy):
 Files, one case a line, whitespace-separated:
     special_bessel_airy.txt     x Ai Ai' Bi Bi'
     special_bessel_kelvin.txt   n x ber bei ker kei I_n(|x|)  (ker, kei 0 for x < 0)
+    special_bessel_kn.txt       n x K_n(x)  (normal results only)
 """
 import math
 import os
@@ -71,10 +72,21 @@ def kelvin(dirname):
     write(dirname, 'kelvin', 'n x ber bei ker kei I_n(|x|)', rows)
 
 
+def kn(dirname):
+    rows = []
+    for n in (0, 1, 2, 3, 5, 10, 20, 50, 100, -1, -7):
+        for x in sorted(loguni(1e-6, 700.0, 300) + around([2.0])):
+            v = mp.besselk(n, mp.mpf(x))
+            if 2.2250738585072014e-308 < v < 1.7976931348623157e308:
+                rows.append([n, x, v])
+    write(dirname, 'kn', 'n x K_n(x)', rows)
+
+
 def main():
     dirname = sys.argv[1] if len(sys.argv) > 1 else 'tests/data'
     airy(dirname)
     kelvin(dirname)
+    kn(dirname)
 
 
 if __name__ == '__main__':

@@ -13,7 +13,7 @@ terms that cancel, I_n(x) for ber, bei and (2 + |ln(x/2)| + ln(n + x + 2)) I_n(x
 for ker, kei, or the modulus where that is larger; the rows "x <= 10" also give
 the error relative to the modulus itself.
 
-Usage: /usr/bin/python3 tools/special/accuracy_bessel.py build/libtsmath.so [airy|kelvin ...]
+Usage: /usr/bin/python3 tools/special/accuracy_bessel.py build/libtsmath.so [airy|kelvin|kn ...]
 """
 import ctypes
 import os
@@ -34,6 +34,7 @@ def lib_funcs(path):
     ctypes.CDLL(path.replace('libtsmath.so', 'host/libtsrt.so'), mode=ctypes.RTLD_GLOBAL)
     lib = ctypes.CDLL(path)
     lib.TS_Airy.argtypes = [D, P, P, P, P]
+    lib.TS_BesselKn.argtypes = [ctypes.c_int32, D, P]
     lib.TS_KelvinI.argtypes = [D, ctypes.c_int32, P, P]
     lib.TS_KelvinK.argtypes = [D, ctypes.c_int32, P, P]
     return lib
@@ -98,10 +99,25 @@ def kelvin_rows(lib):
         yield row('KelvinK, %s, x <= 10, relative to the modulus' % label, 'as above', okr, nan)
 
 
+def kn_rows(lib):
+    for orders in ((0, 1), (2, 3, 5, 10, 20, 50, 100)):
+        o, t = [], []
+        per = 10000 // len(orders)
+        for n in orders:
+            for x in with_breaks(logspace(1e-6, 705, per), [2.0]):
+                r = mp.besselk(n, mp.mpf(x))
+                if not TINY < r < 1.7976931348623157e308:
+                    continue  # outside the normal range no relative accuracy
+                o.append(err(call(lib.TS_BesselKn, n, x), r))
+                t.append(err(float(sc.kn(n, x)), r))
+        yield row('BesselK, n in {%s}' % ', '.join(map(str, orders)),
+                  '%d (n, x), x log-spaced in [1e-6, 705] + breaks, normal results' % len(o), o, t)
+
+
 def main():
     lib = lib_funcs(sys.argv[1] if len(sys.argv) > 1 else 'build/libtsmath.so')
-    which = sys.argv[2:] or ['airy', 'kelvin']
-    for name, rows in (('airy', airy_rows), ('kelvin', kelvin_rows)):
+    which = sys.argv[2:] or ['airy', 'kelvin', 'kn']
+    for name, rows in (('airy', airy_rows), ('kelvin', kelvin_rows), ('kn', kn_rows)):
         if name in which:
             for r in rows(lib):
                 print(r)

@@ -1,7 +1,7 @@
 #!/usr/bin/python3
-"""Coefficient sets of the Airy kernel.
+"""Coefficient sets of the Airy and modified Bessel kernels.
 
-Writes special/airy_coefficients.h: Chebyshev series (the fitting code of
+`airy` writes special/airy_coefficients.h: Chebyshev series (the fitting code of
 fit_integrals.py) in z = 1/zeta, zeta = 2/3 |x|^(3/2), of the smooth factors
 of the asymptotic forms:
   x >= 2.09:    Ai(x)  = A(z) / (2 sqrt(pi) x^(1/4) e^zeta),
@@ -13,8 +13,15 @@ of the asymptotic forms:
                 and for the derivatives, k' = |x|^(1/4)/sqrt(pi),
                 Ai' = -k' (cos(theta) F' + sin(theta) G'), Bi' = k' (sin(theta) F' - cos(theta) G').
 
+`ik` writes special/bessel_ik_coefficients.h: Chebyshev series of
+  e^-x I0(x) and e^-x I1(x)/x on [0, 8], in t = x/4 - 1 (that is (x/2 - 2)/2);
+  K0(x) + ln(x/2) I0(x) and x K1(x) - x ln(x/2) I1(x) on (0, 2], in t = x^2/4 - 1;
+  sqrt(x) e^x K0(x) and sqrt(x) e^x K1(x) on [2, inf), in t = 4/x - 1 (that
+  is (8/x - 2)/2).
+
 Regenerate:
-    /usr/bin/python3 tools/special/fit_bessel.py > special/airy_coefficients.h
+    /usr/bin/python3 tools/special/fit_bessel.py airy > special/airy_coefficients.h
+    /usr/bin/python3 tools/special/fit_bessel.py ik > special/bessel_ik_coefficients.h
 """
 import os
 import sys
@@ -65,13 +72,34 @@ def neg_parts(z, deriv):
     return c * a + s * b, s * a - c * b
 
 
-def main():
-    out = []
+def opening(out, which, fname):
     out.append('// Automatically generated, do not edit.\n')
     out.append('// Generator: tools/special/fit_bessel.py (mpmath, 40 digits).\n')
-    out.append('// Regenerate: /usr/bin/python3 tools/special/fit_bessel.py > special/airy_coefficients.h\n')
+    out.append('// Regenerate: /usr/bin/python3 tools/special/fit_bessel.py %s > special/%s\n' % (which, fname))
     out.append('// Chebyshev sets hold sum c_k T_k(t), t in [-1, 1], c_0 not halved, lowest first.\n')
     out.append('#pragma once\n\n#include "frame/types.h"\n\nnamespace tsm {\n\n')
+
+
+def ik_file(out):
+    opening(out, 'ik', 'bessel_ik_coefficients.h')
+    emit(out, 'kI0Small', cheb(lambda x: mp.exp(-x) * mp.besseli(0, x), 0, 8), 'e^-x I0(x) on [0, 8], t = x/4 - 1')
+    emit(out, 'kI1Small', cheb(lambda x: mp.exp(-x) * mp.besseli(1, x) / x, 0, 8),
+         'e^-x I1(x)/x on [0, 8], t = x/4 - 1')
+    k0s = lambda x: mp.besselk(0, x) + mp.log(x / 2) * mp.besseli(0, x)  # noqa: E731
+    k1s = lambda x: x * mp.besselk(1, x) - x * mp.log(x / 2) * mp.besseli(1, x)  # noqa: E731
+    emit(out, 'kK0Small', cheb(lambda u: k0s(2 * mp.sqrt(u)), 0, 1),
+         'K0(x) + ln(x/2) I0(x) on (0, 2] as a function of u = x^2/4, t = 2 u - 1 = x^2/2 - 1')
+    emit(out, 'kK1Small', cheb(lambda u: k1s(2 * mp.sqrt(u)), 0, 1),
+         'x K1(x) - x ln(x/2) I1(x) on (0, 2] in u = x^2/4, t = x^2/2 - 1')
+    emit(out, 'kK0Large', cheb(lambda w: mp.sqrt(2 / w) * mp.exp(2 / w) * mp.besselk(0, 2 / w), 0, 1),
+         'sqrt(x) e^x K0(x) on [2, inf) in w = 2/x, t = 2 w - 1 = 4/x - 1')
+    emit(out, 'kK1Large', cheb(lambda w: mp.sqrt(2 / w) * mp.exp(2 / w) * mp.besselk(1, 2 / w), 0, 1),
+         'sqrt(x) e^x K1(x) on [2, inf) in w = 2/x, t = 4/x - 1')
+    out.append('}  // namespace tsm\n')
+
+
+def airy_file(out):
+    opening(out, 'airy', 'airy_coefficients.h')
     zpos = 1 / (mp.mpf(2) / 3 * mp.mpf('2.09') ** 1.5)
     zbig = 1 / (mp.mpf(2) / 3 * mp.mpf('8.3203353') ** 1.5)
     note = 'on z in [0, %s], t = 2 z / %s - 1'
@@ -87,6 +115,11 @@ def main():
     out.append('inline constexpr f64 kAiryZPos = %s;\n' % zp)
     out.append('inline constexpr f64 kAiryZBig = %s;\n\n' % zb)
     out.append('}  // namespace tsm\n')
+
+
+def main():
+    out = []
+    {'airy': airy_file, 'ik': ik_file}[sys.argv[1] if len(sys.argv) > 1 else 'airy'](out)
     sys.stdout.write(''.join(l if l.endswith('\n') else l + '\n' for l in out))
 
 

@@ -12,14 +12,13 @@
 #include <cmath>
 #include <cstdio>
 #include <cstdlib>
-#include <fstream>
 #include <functional>
 #include <limits>
-#include <sstream>
 #include <string>
 #include <vector>
 
 #include "tsmath/tsmath.h"
+#include "support/golden_rows.h"
 
 namespace {
 
@@ -27,21 +26,9 @@ constexpr double kEps = 2.220446049250313e-16;
 constexpr double kInf = INFINITY;
 constexpr double kMax = std::numeric_limits<double>::max();
 
-using Row = std::vector<double>;
+using Row = tsmtest::GoldenRow;
 
-std::vector<Row> Load(const std::string& name) {
-  std::ifstream in(std::string(TSM_TEST_DATA) + "/special_bessel_" + name + ".txt");
-  std::vector<Row> rows;
-  std::string line;
-  while (std::getline(in, line)) {
-    if (line.empty() || line[0] == '#') continue;
-    std::istringstream words(line);
-    Row r;
-    for (std::string w; words >> w;) r.push_back(std::strtod(w.c_str(), nullptr));
-    rows.push_back(r);
-  }
-  return rows;
-}
+std::vector<Row> Load(const std::string& name) { return tsmtest::LoadGoldenRows("special_bessel_" + name + ".txt"); }
 
 // Relative to max(|want|, envelope); results in the subnormal range count
 // their rounding there as one eps.
@@ -127,17 +114,7 @@ INSTANTIATE_TEST_SUITE_P(Kernels, Golden,
                                            GoldenCase{"kn", KnError}),
                          [](const auto& info) { return std::string(info.param.file); });
 
-// Exact values and limits: {got, want}; NaN wants NaN.
-void ExpectCases(const std::vector<std::pair<double, double>>& cases) {
-  for (size_t i = 0; i < cases.size(); ++i) {
-    const auto [got, want] = cases[i];
-    if (std::isnan(want)) {
-      EXPECT_TRUE(std::isnan(got)) << "case " << i << " gave " << got;
-    } else {
-      EXPECT_EQ(got, want) << "case " << i;
-    }
-  }
-}
+using tsmtest::ExpectCases;
 
 TEST(Airy, Limits) {
   std::vector<std::pair<double, double>> cases;

@@ -14,14 +14,13 @@
 #include <cmath>
 #include <cstdio>
 #include <cstdlib>
-#include <fstream>
 #include <functional>
 #include <numbers>
-#include <sstream>
 #include <string>
 #include <vector>
 
 #include "tsmath/tsmath.h"
+#include "support/golden_rows.h"
 
 namespace {
 
@@ -29,21 +28,9 @@ constexpr double kEps = 2.220446049250313e-16;
 constexpr double kInf = INFINITY;
 constexpr double kPi = std::numbers::pi;
 
-using Row = std::vector<double>;
+using Row = tsmtest::GoldenRow;
 
-std::vector<Row> Load(const std::string& name) {
-  std::ifstream in(std::string(TSM_TEST_DATA) + "/special_integrals_" + name + ".txt");
-  std::vector<Row> rows;
-  std::string line;
-  while (std::getline(in, line)) {
-    if (line.empty() || line[0] == '#') continue;
-    std::istringstream words(line);
-    Row r;
-    for (std::string w; words >> w;) r.push_back(std::strtod(w.c_str(), nullptr));
-    rows.push_back(r);
-  }
-  return rows;
-}
+std::vector<Row> Load(const std::string& name) { return tsmtest::LoadGoldenRows("special_integrals_" + name + ".txt"); }
 
 double Rel(double got, double want, double scale = 0) {
   const double s = std::fmax(std::fabs(want), scale);
@@ -140,17 +127,7 @@ INSTANTIATE_TEST_SUITE_P(
                       GoldenCase{"jacobi", 32 * kEps, JacobiError}, GoldenCase{"dilog", 8 * kEps, DilogError}),
     [](const auto& info) { return std::string(info.param.file); });
 
-// Exact values and limits: {got, want}; NaN wants NaN.
-void ExpectCases(const std::vector<std::pair<double, double>>& cases) {
-  for (size_t i = 0; i < cases.size(); ++i) {
-    const auto [got, want] = cases[i];
-    if (std::isnan(want)) {
-      EXPECT_TRUE(std::isnan(got)) << "case " << i << " gave " << got;
-    } else {
-      EXPECT_EQ(got, want) << "case " << i;
-    }
-  }
-}
+using tsmtest::ExpectCases;
 
 double ExpI(double x, int32_t n) {
   double r;

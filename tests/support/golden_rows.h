@@ -1,0 +1,47 @@
+// Golden data files of the special-function tests (one case a line of
+// whitespace-separated numbers, hex floats or decimals, '#' lines skipped) and
+// a check of exact values and limits.
+#pragma once
+
+#include <gtest/gtest.h>
+
+#include <cmath>
+#include <cstdlib>
+#include <fstream>
+#include <sstream>
+#include <string>
+#include <utility>
+#include <vector>
+
+namespace tsmtest {
+
+using GoldenRow = std::vector<double>;
+
+// Reads TSM_TEST_DATA/<file>; an unreadable file gives no rows.
+inline std::vector<GoldenRow> LoadGoldenRows(const std::string& file) {
+  std::ifstream in(std::string(TSM_TEST_DATA) + "/" + file);
+  std::vector<GoldenRow> rows;
+  std::string line;
+  while (std::getline(in, line)) {
+    if (line.empty() || line[0] == '#') continue;
+    std::istringstream words(line);
+    GoldenRow r;
+    for (std::string w; words >> w;) r.push_back(std::strtod(w.c_str(), nullptr));
+    rows.push_back(r);
+  }
+  return rows;
+}
+
+// Exact values and limits: {got, want}; NaN wants NaN.
+inline void ExpectCases(const std::vector<std::pair<double, double>>& cases) {
+  for (size_t i = 0; i < cases.size(); ++i) {
+    const auto [got, want] = cases[i];
+    if (std::isnan(want)) {
+      EXPECT_TRUE(std::isnan(got)) << "case " << i << " gave " << got;
+    } else {
+      EXPECT_EQ(got, want) << "case " << i;
+    }
+  }
+}
+
+}  // namespace tsmtest

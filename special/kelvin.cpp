@@ -22,6 +22,7 @@
 #include <limits>
 
 #include "special/common.h"
+#include "special/gamma.h"
 
 namespace tsm {
 namespace {
@@ -48,8 +49,13 @@ void Phase(int32 n, int32 k, f64* c, f64* s) {
 void Series(int32 n, f64 x, bool log_weights, f64* re, f64* im) {
   const f64 y = x * x / 4;
   f64 t = Leading(n, x);  // (x/2)^n y^k / (k! (n + k)!)
+  // psi(1) + psi(n + 1) = -2 Euler + H_n, summed directly for modest n
   f64 h = kMinusTwoEuler;
-  for (int32 j = 1; j <= n; ++j) h += 1.0 / j;
+  if (n <= 64) {
+    for (int32 j = 1; j <= n; ++j) h += 1.0 / j;
+  } else {
+    h = Digamma(n + 1.0) - kEuler;
+  }
   f64 sr = 0, si = 0;
   for (int32 k = 0; t != 0; ++k) {
     const f64 term = log_weights ? t * h : t;
@@ -134,6 +140,7 @@ void KelvinK(int32 n, f64 x, f64* ker, f64* kei) {
       Phase(m, k, &c, &s);
       fr += c * t;
       fi += s * t;
+      if (!IsFiniteValue(t)) break;  // the pole term alone decides
       t *= y / ((k + 1.0) * (m - k - 1.0 > 0 ? m - k - 1.0 : 1.0));
     }
     kr += fr;

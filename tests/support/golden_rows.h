@@ -8,6 +8,7 @@
 #include <cmath>
 #include <cstdlib>
 #include <fstream>
+#include <functional>
 #include <sstream>
 #include <string>
 #include <utility>
@@ -30,6 +31,20 @@ inline std::vector<GoldenRow> LoadGoldenRows(const std::string& file) {
     rows.push_back(r);
   }
   return rows;
+}
+
+// Runs check over every row of a golden file and expects each error at or
+// below tol; returns the worst. A file of 500 rows or fewer is a fault.
+inline double WorstGoldenError(const std::string& file, const std::vector<GoldenRow>& rows, double tol,
+                               const std::function<double(const GoldenRow&)>& check) {
+  EXPECT_GT(rows.size(), 500u) << file;
+  double worst = 0;
+  for (const GoldenRow& r : rows) {
+    const double e = check(r);
+    worst = std::fmax(worst, e);
+    EXPECT_LE(e, tol) << file << " at " << r[0] << (r.size() > 1 ? ", " + std::to_string(r[1]) : "");
+  }
+  return worst;
 }
 
 // Exact values and limits: {got, want}; NaN wants NaN.

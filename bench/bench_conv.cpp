@@ -15,11 +15,12 @@
 #include "transforms/fft2d.h"
 #include "transforms/kwfft_plan.h"
 
-#include "bench_support.h"
+#include "support/random_data.h"
 
 namespace {
 
-using bench::Noise;
+// Reproducible data: the tests' uniform samples in [-1, 1).
+std::vector<double> Noise(size_t n, unsigned seed) { return tsmtest::RandomReal(static_cast<int>(n), seed); }
 
 void Convolve(benchmark::State& state, int32_t algorithm) {
   const int n = static_cast<int>(state.range(0)), m = static_cast<int>(state.range(1));

@@ -10,13 +10,14 @@
 
 #include "transforms/kwfft.h"
 
-#include "bench_support.h"
+#include "support/random_data.h"
 
 namespace {
 
 const std::vector<int64_t> kLengths = {64, 256, 1000, 1024, 4096, 44100, 48000, 65536, 1 << 20, 1009, 4099, 10007};
 
-using bench::Noise;
+// Reproducible data: the tests' uniform samples in [-1, 1).
+std::vector<double> Noise(size_t n, unsigned seed) { return tsmtest::RandomReal(static_cast<int>(n), seed); }
 
 void SetItems(benchmark::State& state, int n) {
   state.SetItemsProcessed(state.iterations() * n);

@@ -6,6 +6,8 @@
 // with the kind of error, the one place where a build may log them.
 #pragma once
 
+#include <cmath>
+
 #include "frame/types.h"
 
 namespace tsm {
@@ -33,6 +35,37 @@ f64 PolyEval(f64 x, const f64* coef, int32 n);
 // The same with an implied leading coefficient 1 and n stored coefficients:
 // x^n + coef[0] x^(n-1) + ... + coef[n-1].
 f64 PolyEval1(f64 x, const f64* coef, int32 n);
+
+// Two pairs of convergents of a continued fraction, p_k = b p_(k-1) + a p_(k-2)
+// and likewise q_k, rescaled by 1/big when |p_k| exceeds big.
+struct Convergents {
+  f64 pkm2, pkm1, qkm2, qkm1;
+  f64 value;  // the last ratio p/q
+
+  // Takes one more term; returns the relative change of the value, or 1 when
+  // the new denominator is 0 (the value then stays).
+  f64 Step(f64 a, f64 b) {
+    const f64 pk = pkm1 * b + pkm2 * a;
+    const f64 qk = qkm1 * b + qkm2 * a;
+    f64 change = 1.0;
+    if (qk != 0) {
+      const f64 r = pk / qk;
+      change = std::fabs((value - r) / r);
+      value = r;
+    }
+    pkm2 = pkm1;
+    pkm1 = pk;
+    qkm2 = qkm1;
+    qkm1 = qk;
+    if (std::fabs(pk) > kBig) {
+      pkm2 *= kBigInv;
+      pkm1 *= kBigInv;
+      qkm2 *= kBigInv;
+      qkm1 *= kBigInv;
+    }
+    return change;
+  }
+};
 
 // The code every kernel passes to the hook.
 inline constexpr int32 kMathKernel = 1;

@@ -22,40 +22,14 @@ namespace {
 constexpr int32 kLargeOrder = 5000;
 
 f64 ContinuedFraction(int32 n, f64 x) {
-  f64 pkm2 = 1, qkm2 = x, pkm1 = 1, qkm1 = x + n;
-  f64 ans = pkm1 / qkm1, t;
+  Convergents cf{1, 1, x, x + n, 1 / (x + n)};
   int32 k = 1;
+  f64 t;
   do {
     ++k;
-    f64 yk, xk;
-    if (k & 1) {
-      yk = 1;
-      xk = n + (k - 1) / 2;
-    } else {
-      yk = x;
-      xk = k / 2;
-    }
-    const f64 pk = pkm1 * yk + pkm2 * xk;
-    const f64 qk = qkm1 * yk + qkm2 * xk;
-    if (qk != 0) {
-      const f64 r = pk / qk;
-      t = std::fabs((ans - r) / r);
-      ans = r;
-    } else {
-      t = 1;
-    }
-    pkm2 = pkm1;
-    pkm1 = pk;
-    qkm2 = qkm1;
-    qkm1 = qk;
-    if (std::fabs(pk) > kBig) {
-      pkm2 *= kBigInv;
-      pkm1 *= kBigInv;
-      qkm2 *= kBigInv;
-      qkm1 *= kBigInv;
-    }
+    t = k & 1 ? cf.Step(n + (k - 1) / 2, 1) : cf.Step(k / 2, x);
   } while (t > kMachEp);
-  return ans * std::exp(-x);
+  return cf.value * std::exp(-x);
 }
 
 f64 PowerSeries(int32 n, f64 x) {

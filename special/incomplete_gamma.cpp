@@ -61,35 +61,16 @@ f64 IncompleteGammaC(f64 a, f64 x) {
   if (x == 0) return 1.0;
   if (x < 1.0 || x < a) return 1.0 - IncompleteGamma(a, x);
   f64 y = 1.0 - a, z = x + y + 1.0, c = 0.0;
-  f64 pkm2 = 1.0, qkm2 = x, pkm1 = x + 1.0, qkm1 = z * x;
-  f64 ans = pkm1 / qkm1, t;
+  Convergents cf{1.0, x + 1.0, x, z * x, (x + 1.0) / (z * x)};
   int32 rounds = 0;
+  f64 t;
   do {
     c += 1.0;
     y += 1.0;
     z += 2.0;
-    const f64 yc = y * c;
-    const f64 pk = pkm1 * z - pkm2 * yc;
-    const f64 qk = qkm1 * z - qkm2 * yc;
-    if (qk != 0) {
-      const f64 r = pk / qk;
-      t = std::fabs((ans - r) / r);
-      ans = r;
-    } else {
-      t = 1.0;
-    }
-    pkm2 = pkm1;
-    pkm1 = pk;
-    qkm2 = qkm1;
-    qkm1 = qk;
-    if (std::fabs(pk) > kBig) {
-      pkm2 *= kBigInv;
-      pkm1 *= kBigInv;
-      qkm2 *= kBigInv;
-      qkm1 *= kBigInv;
-    }
+    t = cf.Step(-(y * c), z);
   } while (t > kMachEp && ++rounds < kMaxFractionRounds);
-  return ans * std::exp(LogPowerFactor(a, x));
+  return cf.value * std::exp(LogPowerFactor(a, x));
 }
 
 }  // namespace tsm

@@ -9,8 +9,8 @@
 //                     2v + 1; 2x) = 0F1(; v + 1; x^2/4) (Kummer's second
 //                     transformation): positive terms, half as many as the
 //                     1F1 series and no e^(2x) to overflow, summed in long
-//                     double; (x/2)^v / Gamma(v + 1) through pow and GammaFn
-//                     (through logarithms where those leave the range).
+//                     double; (x/2)^v / Gamma(v + 1) through pow in long double and
+//                     GammaFn (LogGamma where Gamma overflows).
 // Negative non-integer v: the series for x <= 2, otherwise downward recurrence
 // I_(m-1) = I_(m+1) + (2m/x) I_m from the two positive orders v - floor(v) and
 // v - floor(v) + 1; downward the recurrence follows the growing solution, so
@@ -46,14 +46,10 @@ constexpr f64 kAsymptoticMinX = 20;  // e^-2x, the part the expansion drops, is 
 
 // (x/2)^v / Gamma(v + 1) 0F1(; v + 1; x^2/4), the power series of I_v.
 f64 PowerSeries(f64 v, f64 x) {
-  f64 scale = std::pow(x / 2, v);
   const f64 g = GammaFn(v + 1);
-  long double front;
-  if (IsFiniteValue(scale) && scale > 1e-290 && IsFiniteValue(g) && g != 0) {
-    front = static_cast<long double>(scale) / g;
-  } else {
-    front = std::exp(static_cast<long double>(v) * std::log(static_cast<long double>(x) / 2) - LogGamma(v + 1));
-  }
+  const long double front = IsFiniteValue(g)
+                                ? std::pow(static_cast<long double>(x) / 2, static_cast<long double>(v)) / g
+                                : std::exp(v * std::log(static_cast<long double>(x) / 2) - LogGamma(v + 1));
   const long double z = static_cast<long double>(x) * x / 4;
   long double t = 1, s = 1;
   for (int32 k = 1; k < 100000; ++k) {

@@ -113,7 +113,8 @@ void Integrate(f64 v, ld x0, ld x1, ld* y, ld* dy) {
       dk = next;
       sum += next;
       dsum += (k + 2) * next;
-      if (k >= 2 && std::fabs(next) + std::fabs(d0) <= 1e-21L * (std::fabs(sum) + std::fabs(dsum))) break;
+      // three terms in a row: at x = 0 with v = -1/2 every other pair of terms is 0
+      if (k >= 2 && std::fabs(next) + std::fabs(d0) + std::fabs(d1) <= 1e-21L * (std::fabs(sum) + std::fabs(dsum))) break;
     }
     *y = sum;
     *dy = dsum / h;

@@ -10,7 +10,8 @@
 //                     transformation): positive terms, half as many as the
 //                     1F1 series and no e^(2x) to overflow, summed in long
 //                     double; (x/2)^v / Gamma(v + 1) through pow in long double and
-//                     GammaFn (LogGamma where Gamma overflows).
+//                     GammaFn (Stirling's series for ln Gamma in long double where
+//                     Gamma overflows).
 // Negative non-integer v: the series for x <= 2, otherwise downward recurrence
 // I_(m-1) = I_(m+1) + (2m/x) I_m from the two positive orders v - floor(v) and
 // v - floor(v) + 1; downward the recurrence follows the growing solution, so
@@ -44,12 +45,23 @@ constexpr long double kPi = 3.141592653589793238462643383279503L;
 constexpr int32 kAsymptoticTerms = 100;
 constexpr f64 kAsymptoticMinX = 20;  // e^-2x, the part the expansion drops, is below MACHEP
 
+// ln Gamma(z) for z > 170 by Stirling's series in long double: the exponent
+// v ln(x/2) - ln Gamma(v + 1) of large orders runs to thousands, and every
+// unit of its rounding is a relative error of the result.
+long double LogGammaLarge(long double z) {
+  const long double r = 1 / (z * z);
+  const long double series = (1.0L / 12 - r * (1.0L / 360 - r * (1.0L / 1260 - r / 1680))) / z;
+  return (z - 0.5L) * std::log(z) - z + 0.91893853320467274178032973640561764L + series;
+}
+
 // (x/2)^v / Gamma(v + 1) 0F1(; v + 1; x^2/4), the power series of I_v.
 f64 PowerSeries(f64 v, f64 x) {
-  const f64 g = GammaFn(v + 1);
+  // v Gamma(v) rather than Gamma(v + 1): v + 1 may round, and the slope of
+  // ln Gamma (about ln v) would turn that into several ulps.
+  const f64 g = v >= 1 ? v * GammaFn(v) : GammaFn(v + 1);
   const long double front = IsFiniteValue(g)
                                 ? std::pow(static_cast<long double>(x) / 2, static_cast<long double>(v)) / g
-                                : std::exp(v * std::log(static_cast<long double>(x) / 2) - LogGamma(v + 1));
+                                : std::exp(v * std::log(static_cast<long double>(x) / 2) - LogGammaLarge(v + 1.0L));
   const long double z = static_cast<long double>(x) * x / 4;
   long double t = 1, s = 1;
   for (int32 k = 1; k < 100000; ++k) {

@@ -50,7 +50,7 @@ constexpr f64 kHalfLn2 = 0.34657359027997264;  // 2^(v/2) = exp(v ln2/2)
 constexpr f64 kAsymptoticMinX = 7;
 constexpr int32 kAsymptoticTerms = 60;
 constexpr f64 kMaxLoss = 8;  // largest term over the sum accepted in the 2F0
-constexpr f64 kMaxStart = 150;
+constexpr f64 kMaxStart = 200;  // e^(-x0^2/4) stays within the range of long double
 
 constexpr ld kPi = 3.141592653589793238462643383279503L;
 
@@ -77,7 +77,7 @@ bool Growing(f64 v, f64 x, ld* d) {
   f64 s;
   if (!Series2F0((v + 1) / 2, (v + 2) / 2, 2 / (x * x), &s)) return false;
   const ld lx = x;
-  *d = kSqrtTwoPi / static_cast<ld>(GammaFn(-v)) * std::exp(lx * lx / 4 - (v + 1) * std::log(lx)) * s;
+  *d = kSqrtTwoPi / static_cast<ld>(GammaFn(-v)) * std::exp(lx * lx / 4 - (v + 1.0L) * std::log(lx)) * s;
   return true;
 }
 

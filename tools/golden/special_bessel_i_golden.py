@@ -17,8 +17,8 @@ for a negative non-integer order, whose I_v has zeros, I_|v| + (2/pi)
 |sin(pi v)| K_|v| (the two terms of I_-u = I_u + (2/pi) sin(pi u) K_u).
 D_v: |D_v| where it is monotone; for x < 0 the sum of the magnitudes of the
 two terms of D_v(-x) = cos(pi v) D_v(x) + pi/Gamma(-v) V(-v-1/2, x); in the
-oscillating region x^2 < 4v + 2 also the largest |D_v| within one local
-period sqrt(v + 1/2 - x^2/4) of x.
+oscillating region x^2 < 4v + 2 also the largest |D_v| within half a local
+period, pi/k with k = sqrt(v + 1/2 - x^2/4) (at most 1), of x.
 """
 import math
 import os
@@ -27,20 +27,12 @@ import sys
 import mpmath as mp
 import numpy as np
 
+sys.path.insert(0, os.path.dirname(os.path.abspath(__file__)))
+from special_bessel_golden import around, hx  # noqa: E402
+
 mp.mp.dps = 40
 rng = np.random.RandomState(20261123)
 TINY, HUGE = 2.2250738585072014e-308, 1.7976931348623157e308
-
-
-def hx(v):
-    return float(v).hex()
-
-
-def around(points):
-    out = []
-    for p in points:
-        out += [math.nextafter(p, -math.inf), p, math.nextafter(p, math.inf)]
-    return out
 
 
 def write(dirname, name, header, rows):

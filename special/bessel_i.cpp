@@ -12,20 +12,22 @@
 //                     double; (x/2)^v / Gamma(v + 1) through pow in long double and
 //                     GammaFn (Stirling's series for ln Gamma in long double where
 //                     Gamma overflows).
-// Negative non-integer v: the series for x <= 2, otherwise downward recurrence
-// I_(m-1) = I_(m+1) + (2m/x) I_m from the two positive orders v - floor(v) and
-// v - floor(v) + 1; downward the recurrence follows the growing solution, so
-// it is stable. I_-n = I_n; for x < 0, I_n(-x) = (-1)^n I_n(x) and a
-// non-integer order is a domain error (NaN). x = 0: 1 for v = 0, 0 for v > 0,
-// +inf (singularity) for negative non-integer v. x = +-inf gives the infinity
-// of I's sign; an infinite v is a domain error; results beyond the range
-// overflow to +-inf (overflow hook).
+// Negative non-integer v: the series for x <= 2; above, where its terms of
+// alternating sign cancel, I_-u = I_u + (2/pi) sin(pi u) K_u (u = -v), K_u
+// from K_f and K_(f+1), f = u - floor(u), by the trapezoidal rule on their
+// integral and the upward recurrence of K. I_-n = I_n; for x < 0, I_n(-x) =
+// (-1)^n I_n(x) and a non-integer order is a domain error (NaN). x = 0: 1 for
+// v = 0, 0 for v > 0, +inf (singularity) for negative non-integer v.
+// x = +-inf gives the infinity of I's sign; an infinite v is a domain error;
+// results beyond the range overflow to +-inf (overflow hook).
 //
-// Accuracy against mpmath at 40 digits (tools/special/accuracy_bessel_i.py,
-// v in [-50, 100], x log-spaced in [1e-6, 720], normal results): see the
-// table in docs/accuracy.md; relative error for v >= 0 and integer v, relative
-// to I_|v| + (2/pi) |sin(pi v)| K_|v| for negative non-integer v, whose I_v has
-// zeros.
+// Domain: v in [-50, 1000], x in [1e-6, 1e4], normal results. Accuracy
+// against mpmath at 40 digits (tools/special/accuracy_bessel_i.py, 2.6e4
+// points), relative for v >= 0, and for negative non-integer v, whose I_v has
+// zeros, relative to I_u + (2/pi) |sin(pi u)| K_u:
+//   v in [0, 100], x in [1e-6, 720]:      max @IPOS@, median @IPOSMED@
+//   v in [-50, 0), x in [1e-6, 720]:      max @INEG@, median @INEGMED@
+//   v in [100, 1000], x in [1e-3, 1e4]:   max @IBIG@, median @IBIGMED@
 #include "special/bessel_i.h"
 
 #include <cmath>

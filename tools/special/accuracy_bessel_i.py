@@ -69,8 +69,8 @@ def iv_rows(lib):
          [float(v) for v in rng.uniform(0, 100, 40)] + [0.0, 1.0, 2.0, 5.0, 10, 20, 37, 50, 77, 100], xs),
         ('v in [-50, 0), non-integer', 'v: 50 uniform in [-50, 0); x: 240 log-spaced in [1e-6, 720]',
          [float(v) for v in rng.uniform(-50, 0, 50)], xs),
-        ('v in [100, 1000]', 'v: 20 uniform in [100, 1000]; x: 200 log-spaced in [1e-3, 1e4]',
-         [float(v) for v in rng.uniform(100, 1000, 20)], logspace(1e-3, 1e4, 200)),
+        ('v in [100, 1000]', 'v: 25 uniform in [100, 1000]; x: 400 log-spaced in [1, 1e4]',
+         [float(v) for v in rng.uniform(100, 1000, 25)], logspace(1, 1e4, 400)),
     ]
     for label, grid, orders, args in regions:
         pts = [(v, x) for v in orders for x in args]

@@ -92,9 +92,9 @@ def pcfd_rows(lib):
         vs += [float(k) for k in range(0, min(vmax, 30) + 1, 3)]
         xs = [float(x) for x in np.linspace(-xmax, xmax, n)] + [-7.0, 7.0]
         o, t = measure([(v, x) for v in vs for x in xs], lambda v, x: mp.pcfd(v, x), pcfd_envelope, ours, theirs)
-        grid = 'v: %d in [-%d, %d] + integers; x: %d uniform in [-%d, %d] + 7, -7; %d normal results' % (
+        grid = 'v: %d evenly spaced and jittered in [-%d, %d] + integers; x: %d evenly spaced in [-%d, %d] + 7, -7; %d normal results' % (
             n, vmax, vmax, n, xmax, xmax, len(o))
-        yield row('ParabolicCylinderD, |v| <= %d, |x| <= %d' % (vmax, xmax), grid, o, t)
+        yield row('ParabolicCylinderD, \\|v\\| <= %d, \\|x\\| <= %d' % (vmax, xmax), grid, o, t)
 
 
 def main():

@@ -92,6 +92,7 @@ TEST(ParabolicCylinder, DomainAndLimits) {
       {Dv(3, 0), 0},
       {Dv(-0.5, -60), kInf},  // overflow
       {Dv(30, 1e3), 0},       // underflow
+      {Dv(2.5, 1e3), 0},
   });
 }
 

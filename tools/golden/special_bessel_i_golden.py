@@ -59,6 +59,8 @@ def iv(dirname):
         if v == math.floor(v):
             xs += [-x for x in xs[:10]]
         pts += [(v, x) for x in xs]
+    big = [float(v) for v in rng.uniform(100, 1000, 300)]
+    pts += [(v, float(x)) for v, x in zip(big, np.exp(rng.uniform(0, math.log(1e4), 300)))]
     rows = []
     for v, x in pts:
         ref = mp.re(mp.besseli(v, x, zeroprec=1200, infprec=1200))
@@ -82,6 +84,7 @@ def pcfd_envelope(v, x, ref):
 def pcfd(dirname):
     pts = [(float(v), float(x)) for v, x in zip(rng.uniform(-30, 30, 2000), rng.uniform(-30, 30, 2000))]
     pts += [(float(v), float(x)) for v, x in zip(rng.uniform(-3, 3, 500), rng.uniform(-10, 10, 500))]
+    pts += [(float(v), float(x)) for v, x in zip(rng.uniform(-100, 100, 300), rng.uniform(-60, 60, 300))]
     near = [n + d for n in (0, 1, 2, 5, 12, 29) for d in (-1e-9, 1e-12, 1e-6, 0.5)] + [-7.0, -1.0, -0.5]
     for v in [float(n) for n in range(0, 31, 3)] + near:
         pts += [(v, float(x)) for x in rng.uniform(-30, 30, 25)]

@@ -115,6 +115,22 @@ f64 BesselJSeries(f64 v, f64 x, long double factor) {
   return static_cast<f64>(factor * SeriesPrefactor(v, x) * sum);
 }
 
+namespace {
+
+// The recurrence C_(m+1) = (2m/x) C_m - C_(m-1) upward, `steps` times from
+// a = C_(m-1), b = C_m, in long double; stops at an infinity.
+long double Recur(long double a, long double b, f64 m, f64 x, int64_t steps) {
+  const long double xi = 2 / static_cast<long double>(x);
+  for (int64_t k = 0; k < steps && std::isfinite(b); ++k) {
+    const long double next = (m + k) * xi * b - a;
+    a = b;
+    b = next;
+  }
+  return b;
+}
+
+}  // namespace
+
 bool BesselJYHankel(f64 nu, f64 x, f64* j, f64* y) {
   const f64 mu = 4 * nu * nu;
   f64 p = 1, q = 0, term = 1;
@@ -149,20 +165,9 @@ bool BesselJYUpward(f64 nu, f64 x, f64* j, f64* y) {
   const f64 n = std::floor(nu), mu = nu - n;
   f64 j0, y0, j1, y1;
   if (!BesselJYHankel(mu, x, &j0, &y0) || !BesselJYHankel(mu + 1, x, &j1, &y1)) return false;
-  using L = long double;
-  L ja = j0, jb = j1, ya = y0, yb = y1;
-  const L xi = 2 / static_cast<L>(x);
   const int64_t steps = static_cast<int64_t>(n);
-  for (int64_t k = 1; k < steps; ++k) {
-    const L r = (mu + k) * xi;
-    const L jn = r * jb - ja, yn = r * yb - ya;
-    ja = jb;
-    jb = jn;
-    ya = yb;
-    yb = yn;
-  }
-  *j = static_cast<f64>(steps == 0 ? ja : jb);
-  if (y) *y = static_cast<f64>(steps == 0 ? ya : yb);
+  *j = static_cast<f64>(steps == 0 ? j0 : Recur(j0, j1, mu + 1, x, steps - 1));
+  if (y) *y = static_cast<f64>(steps == 0 ? y0 : Recur(y0, y1, mu + 1, x, steps - 1));
   return true;
 }
 
@@ -226,44 +231,49 @@ void TemmeY(f64 mu, f64 x, f64* ymu, f64* ymu1) {
   *ymu1 = -sum1 * 2 / x;
 }
 
-// Steed's continued fraction for p + iq = (J'_mu + iY'_mu)/(J_mu + iY_mu).
+// Steed's continued fraction for p + iq = (J'_mu + iY'_mu)/(J_mu + iY_mu),
+// modified Lentz; in long double, since for mu near x it runs about mu terms
+// before it settles.
 std::complex<f64> SteedCF(f64 mu, f64 x) {
-  using C = std::complex<f64>;
+  using C = std::complex<long double>;
   const C tiny(kTiny, 0);
+  const long double mu2 = static_cast<long double>(mu) * mu;
   // K = a1/(b1 + a2/(b2 + ...)), a_k = (k - 1/2)^2 - mu^2, b_k = 2(x + ik)
-  C f(2 * x, 2), c = f, d = 0;
+  C f(2.0L * x, 2), c = f, d = 0;
   for (int k = 2; k < kMaxTerms; ++k) {
-    const f64 a = (k - 0.5) * (k - 0.5) - mu * mu;
-    const C b(2 * x, 2.0 * k);
+    const long double a = (k - 0.5L) * (k - 0.5L) - mu2;
+    const C b(2.0L * x, 2.0L * k);
     d = b + a * d;
-    if (d == 0.0) d = tiny;
+    if (d == 0.0L) d = tiny;
     c = b + a / c;
-    if (c == 0.0) c = tiny;
-    d = 1.0 / d;
+    if (c == 0.0L) c = tiny;
+    d = 1.0L / d;
     const C delta = c * d;
     f *= delta;
-    if (std::abs(delta - 1.0) < kMachEp / 2) break;
+    if (std::abs(delta - 1.0L) < kEpsLong) break;
   }
-  const C k = (0.25 - mu * mu) / f;
-  return C(-0.5 / x, 1) + C(0, 1) * k / x;
+  const C k = (0.25L - mu2) / f;
+  const C pq = C(-0.5L / x, 1) + C(0, 1) * k / static_cast<long double>(x);
+  return {static_cast<f64>(pq.real()), static_cast<f64>(pq.imag())};
 }
 
 }  // namespace
 
 void BesselJYSteed(f64 nu, f64 x, f64* j, f64* y) {
+  using L = long double;
   const f64 steps = x < 2 ? std::floor(nu + 0.5) : std::fmax(0, std::floor(nu - x + 1.5));
   const int64_t nl = static_cast<int64_t>(steps);
   const f64 mu = nu - steps;
   int sign;
   const f64 f = RatioCF(nu, x, &sign);
   // downward from nu with J_nu = sign, J'_nu = sign f
-  f64 jl = sign, jpl = sign * f;
+  const L xi = 1 / static_cast<L>(x);
+  L jl = sign, jpl = sign * f, k = nu;
   int64_t scale = 0;
-  f64 k = nu;
   for (int64_t l = 0; l < nl; ++l) {
-    const f64 jm = k / x * jl + jpl;
+    const L jm = k * xi * jl + jpl;
     k -= 1;
-    jpl = k / x * jm - jl;
+    jpl = k * xi * jm - jl;
     jl = jm;
     if (std::fabs(jl) > kRescaleAt) {
       jl = std::ldexp(jl, -kRescaleExp);
@@ -272,7 +282,7 @@ void BesselJYSteed(f64 nu, f64 x, f64* j, f64* y) {
     }
   }
   const f64 w = kTwoOverPi / x;  // the Wronskian J Y' - J' Y
-  const f64 fmu = jpl / jl;
+  const f64 fmu = static_cast<f64>(jpl / jl);
   f64 jmu, ymu, ymu1;
   if (x < 2) {
     TemmeY(mu, x, &ymu, &ymu1);
@@ -282,23 +292,16 @@ void BesselJYSteed(f64 nu, f64 x, f64* j, f64* y) {
     const std::complex<f64> pq = SteedCF(mu, x);
     const f64 p = pq.real(), q = pq.imag();
     const f64 gamma = (p - fmu) / q;
-    jmu = std::copysign(std::sqrt(w / (q * (1 + gamma * gamma))), jl);
+    jmu = std::copysign(std::sqrt(w / (q * (1 + gamma * gamma))), static_cast<f64>(jl));
     ymu = gamma * jmu;
     const f64 ypmu = p * ymu + q * jmu;
     ymu1 = mu / x * ymu - ypmu;
   }
   // J_nu = J_mu times (J_nu / J_mu) of the unnormalised recurrence
-  const f64 r = jmu / jl;
-  *j = scale > 0 ? std::ldexp(r * sign, static_cast<int>(std::max<int64_t>(-100000, -scale * kRescaleExp))) : r * sign;
+  const L r = sign * (jmu / jl);
+  *j = static_cast<f64>(scale > 0 ? std::ldexp(r, static_cast<int>(std::max<int64_t>(-100000, -scale * kRescaleExp))) : r);
   if (!y) return;
-  f64 a = ymu, b = ymu1, m = mu + 1;
-  for (int64_t l = 1; l < nl && std::isfinite(b); ++l) {
-    const f64 next = 2 * m / x * b - a;
-    a = b;
-    b = next;
-    m += 1;
-  }
-  *y = nl == 0 ? a : b;
+  *y = static_cast<f64>(nl == 0 ? ymu : Recur(ymu, ymu1, mu + 1, x, nl - 1));
   if (!std::isfinite(*y)) *y = -std::numeric_limits<f64>::infinity();
 }
 

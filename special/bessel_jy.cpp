@@ -42,6 +42,7 @@
 #include <cmath>
 #include <cstdint>
 #include <limits>
+#include <numbers>
 
 #include "special/bessel_jy_parts.h"
 #include "special/common.h"
@@ -57,6 +58,7 @@ constexpr f64 kLargeOrder = 500;              // Hankel's form only for x/nu^2 a
 constexpr f64 kParityModulus = 16384;         // parity of n from n mod 16384
 constexpr f64 kParityScale = 6.103515625e-5;  // 1/16384
 constexpr f64 kTemmeSteedSwitch = 2;
+constexpr f64 kOutOfRange = 760;  // e^-760 is far below the smallest subnormal
 constexpr f64 kUpwardFrom = 25;  // Hankel's expansion of orders below 2 reaches e^-50 from here
 
 bool OddInteger(f64 an) { return std::fmod(an - kParityModulus * std::floor(an * kParityScale), 2.0) == 1; }
@@ -66,15 +68,33 @@ bool OddInteger(f64 an) { return std::fmod(an - kParityModulus * std::floor(an *
 // precision.
 f64 SeriesLimit(f64 nu) { return std::fmax(kTemmeSteedSwitch, 3.6 * std::sqrt(nu)); }
 
-// Hankel's expansion is tried from x = 17 up for orders below 3.6 sqrt(x)
-// (its terms then fall to about e^-2x; it declines where they do not reach
-// the rounding), and for large orders beyond x = 0.3 nu^2.
+// Hankel's expansion is tried beyond the classic boundary t(nu) for orders
+// below 3.6 sqrt(x), and for large orders beyond x = 0.3 nu^2; it declines
+// where its terms do not reach the rounding (near t they fall only to about
+// e^-2x) or first grow too large.
 bool HankelRegion(f64 nu, f64 x) {
-  return (x >= 17 && nu < 3.6 * std::sqrt(x)) || (nu >= kLargeOrder && x > 0.3 * nu * nu);
+  const f64 t = nu < 26 ? (0.0083 * nu + 0.09) * nu + 12.9 : 0.9 * nu;
+  return (x > t && nu < 3.6 * std::sqrt(x)) || (nu >= kLargeOrder && x > 0.3 * nu * nu);
+}
+
+// Below the turning point, x = nu sech(a), J_nu(x) is about
+// e^-nu(a - tanh a) / sqrt(2 pi nu tanh a) and Y_nu(x) minus twice its
+// reciprocal: true when that exponent puts J below the subnormal range and Y
+// beyond the largest double, with a wide margin.
+bool BeyondRange(f64 nu, f64 x) {
+  if (x >= nu) return false;
+  const f64 z = x / nu, s = std::sqrt((1 - z) * (1 + z));
+  const f64 e = nu * (std::log((1 + s) / z) - s) - 0.5 * std::log(2 * std::numbers::pi * nu * s);
+  return e > kOutOfRange;
 }
 
 // J_nu and, if y is not null, Y_nu, for nu >= 0 and finite x > 0.
 void JYNonNegative(f64 nu, f64 x, f64* j, f64* y) {
+  if (BeyondRange(nu, x)) {  // spares a recurrence of about nu - x steps
+    *j = 0;
+    if (y) *y = -kInf;
+    return;
+  }
   if (HankelRegion(nu, x) && BesselJYHankel(nu, x, j, y)) return;
   if (!y) {
     if (x * x < (nu + 1) * kMachEp) {
@@ -160,6 +180,7 @@ f64 BesselY(f64 v, f64 x) {
   if (InfinitySign(x) > 0) return 0;
   if (!integer) return Checked(NonIntegerOrder(v, x, true));
   const int64_t m = static_cast<int64_t>(std::fabs(n));
+  if (BeyondRange(static_cast<f64>(m), x)) return MathError(kMathOverflow, -sign * kInf);
   f64 j, a, b;
   BesselJY01(0, x, &j, &a);
   if (m == 0) return a;

@@ -40,7 +40,6 @@ constexpr f64 kRescaleAt = 0x1p800;
 constexpr long double kEpsLong = 1.0842021724855044e-19L;  // 2^-63
 constexpr int kMaxTerms = 100000;
 constexpr f64 kHankelHump = 16;  // largest term of Hankel's series accepted
-constexpr int kMaxRatioTerms = 10000000;  // the ratio's fraction needs about x terms
 
 }  // namespace
 
@@ -184,7 +183,7 @@ f64 RatioCF(f64 nu, f64 x, int* sign) {
   if (f == 0) f = kTiny;
   L c = f, d = 0, b = 2 * nu * xi;
   *sign = 1;
-  for (int i = 0; i < kMaxRatioTerms; ++i) {
+  for (int i = 0; i < kMaxTerms; ++i) {
     b += 2 * xi;
     d = b - d;
     if (d == 0) d = kTiny;

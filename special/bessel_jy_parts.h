@@ -2,6 +2,8 @@
 // bessel_jy_core.cpp. Orders nu >= 0 and x > 0 unless stated.
 #pragma once
 
+#include <cstdint>
+
 #include "frame/types.h"
 
 namespace tsm {
@@ -17,6 +19,10 @@ long double SeriesPrefactor(f64 v, f64 x);
 
 // factor times the power series of J_v, summed in long double.
 f64 BesselJSeries(f64 v, f64 x, long double factor = 1);
+
+// The recurrence C_(m+1) = (2m/x) C_m - C_(m-1) upward, `steps` times from
+// a = C_(m-1), b = C_m, in long double; stops at an infinity.
+long double BesselRecurUp(long double a, long double b, f64 m, f64 x, int64_t steps);
 
 // Hankel's asymptotic expansion; false when its terms do not fall below the
 // rounding before they grow again. y may be null.

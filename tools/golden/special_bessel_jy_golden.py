@@ -28,14 +28,12 @@ import sys
 import mpmath as mp
 import numpy as np
 
+sys.path.insert(0, os.path.dirname(os.path.abspath(__file__)))
+from special_bessel_golden import write  # noqa: E402
+
 mp.mp.dps = 40
 BIG = dict(maxprec=200000, maxterms=10 ** 6)
 rng = np.random.RandomState(20261125)
-
-
-def hx(v):
-    v = float(v)
-    return v.hex() if math.isfinite(v) else repr(v)
 
 
 def loguni(a, b, n):
@@ -111,18 +109,12 @@ def spherical_cases():
     return cases
 
 
-def write(dirname, name, header, rows):
-    with open(os.path.join(dirname, 'special_bessel_jy_%s.txt' % name), 'w') as f:
-        f.write('# %s\n' % header)
-        for r in rows:
-            f.write(' '.join(hx(v) for v in r) + '\n')
-
-
 def main():
     dirname = sys.argv[1] if len(sys.argv) > 1 else 'tests/data'
     with multiprocessing.Pool(2) as pool:
-        write(dirname, 'real', 'v x J Y scaleJ scaleY', pool.map(real_row, real_cases(), chunksize=8))
-        write(dirname, 'spherical', 'n x j y scale_j scale_y', pool.map(spherical_row, spherical_cases(), chunksize=8))
+        write(dirname, 'jy_real', 'v x J Y scaleJ scaleY', pool.map(real_row, real_cases(), chunksize=8))
+        write(dirname, 'jy_spherical', 'n x j y scale_j scale_y',
+              pool.map(spherical_row, spherical_cases(), chunksize=8))
 
 
 if __name__ == '__main__':

@@ -79,18 +79,20 @@ def spherical_point(nx):
     return ours, theirs
 
 
-def run(pool, fn, pts):
+def pair_rows(pool, fn, pts, names, grid):
+    """Rows of the first and the second kind over one grid."""
     res = pool.map(fn, pts, chunksize=16)
-    return [[r[0][k] for r in res] for k in (0, 1)], [[r[1][k] for r in res] for k in (0, 1)]
+    for k, name in enumerate(names):
+        ours = [r[0][k] for r in res]
+        theirs = [r[1][k] for r in res if r[1][k] == r[1][k]]
+        yield row(name, grid if k == 0 else 'as above', ours, theirs)
 
 
 def j01_rows(pool):
     xs = with_breaks(logspace(1e-6, 1e4, 5000), [2.0, 8.0, 17.0, 25.0])
     pts = [(v, x) for v in (0.0, 1.0) for x in xs]
-    o, t = run(pool, real_point, pts)
     grid = '%d (v, x), v in {0, 1}, x log-spaced in [1e-6, 1e4] + breaks' % len(pts)
-    yield row('BesselJ, orders 0 and 1', grid, o[0], t[0])
-    yield row('BesselY, orders 0 and 1', 'as above', o[1], t[1])
+    return pair_rows(pool, real_point, pts, ('BesselJ, orders 0 and 1', 'BesselY, orders 0 and 1'), grid)
 
 
 def real_rows(pool):
@@ -99,10 +101,9 @@ def real_rows(pool):
     orders += [n + d for n in (2, 5, 30, -3, -40) for d in (1e-6, -1e-3)]
     xs = with_breaks(logspace(1e-6, 1e4, 120), [2.0, 17.0, 25.0, 200.0])
     pts = [(v, x) for v in orders for x in xs + [abs(v), 3.6 * math.sqrt(abs(v)) or 1.0]]
-    o, t = run(pool, real_point, pts)
-    grid = '%d (v, x), v in [-100, 100] (random, integers, near-integers), x log-spaced in [1e-6, 1e4] + breaks' % len(pts)
-    yield row('BesselJ, |v| <= 100', grid, o[0], t[0])
-    yield row('BesselY, |v| <= 100', 'as above', o[1], t[1])
+    grid = ('%d (v, x), v in [-100, 100] (random, integers, near-integers), x log-spaced in [1e-6, 1e4] + breaks'
+            % len(pts))
+    return pair_rows(pool, real_point, pts, ('BesselJ, \\|v\\| <= 100', 'BesselY, \\|v\\| <= 100'), grid)
 
 
 def large_rows(pool):
@@ -110,20 +111,16 @@ def large_rows(pool):
     pts = []
     for nu in (500.0, 700.5, 1000.0, 1500.25, 2000.0, 3000.5, 4000.0, 4999.7):
         pts += [(s * nu, nu * float(t)) for s in ((1, -1) if nu != int(nu) else (1,))
-                for t in rng.uniform(0.5, 1.3, 40)]
-    o, t = run(pool, real_point, pts)
-    grid = '%d (v, x), |v| from 500 to 5000, x in [0.5 |v|, 1.3 |v|]' % len(pts)
-    yield row('BesselJ, large orders', grid, o[0], t[0])
-    yield row('BesselY, large orders', 'as above', o[1], t[1])
+                for t in rng.uniform(0.5, 1.3, 60)]
+    grid = '%d (v, x), \\|v\\| from 500 to 5000, x in [0.5 \\|v\\|, 1.3 \\|v\\|]' % len(pts)
+    return pair_rows(pool, real_point, pts, ('BesselJ, large orders', 'BesselY, large orders'), grid)
 
 
 def spherical_rows(pool):
     xs = with_breaks(logspace(1e-6, 1e4, 100), [2.0, 17.0, 25.0])
     pts = [(n, x) for n in list(range(-20, 21)) + list(range(25, 101, 5)) for x in xs]
-    o, t = run(pool, spherical_point, pts)
     grid = '%d (n, x), n in [-20, 100], x log-spaced in [1e-6, 1e4] + breaks (scipy: n >= 0)' % len(pts)
-    yield row('SphericalBesselJ', grid, o[0], [e for e in t[0] if e == e])
-    yield row('SphericalBesselY', 'as above', o[1], [e for e in t[1] if e == e])
+    return pair_rows(pool, spherical_point, pts, ('SphericalBesselJ', 'SphericalBesselY'), grid)
 
 
 def init(path):

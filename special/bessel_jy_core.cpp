@@ -25,6 +25,7 @@
 // accuracy (tools/special/accuracy_bessel_jy.py): orders 0 and 1 to 1.2e-15
 // (J) and 1.5e-15 (Y) of the modulus for x in [1e-6, 1e4]; the general
 // orders as listed in bessel_jy.cpp.
+#include <algorithm>
 #include <cmath>
 #include <complex>
 #include <cstdint>
@@ -55,7 +56,8 @@ void SinCosPi(f64 r, f64* s, f64* c) {
   const f64 q = std::nearbyint(2 * r);  // quarter turns
   const f64 f = r - q / 2;               // exact, |f| <= 1/4
   const f64 sf = std::sin(kPi * f), cf = std::cos(kPi * f);
-  switch (static_cast<int>(std::fmod(std::fabs(q), 4.0)) * (q < 0 ? -1 : 1) & 3) {
+  // fmod keeps the sign of q; & 3 then gives q mod 4 for either sign
+  switch (static_cast<int>(std::fmod(q, 4.0)) & 3) {
     case 0: *s = sf; *c = cf; break;
     case 1: *s = cf; *c = -sf; break;
     case 2: *s = -sf; *c = -cf; break;
@@ -203,31 +205,37 @@ f64 RatioCF(f64 nu, f64 x, int* sign) {
   return static_cast<f64>(f);
 }
 
-// Temme's series for Y_mu and Y_(mu+1), |mu| <= 1/2, x < 2.
+// Temme's series for Y_mu and Y_(mu+1), |mu| <= 1/2, x < 2:
+// Y_mu = -sum c_k g_k and Y_(mu+1) = -(2/x) sum c_k (p_k - k g_k), with
+// c_k = (-x^2/4)^k / k!, g_k = f_k + (2/mu) sin^2(pi mu/2) q_k and
+// f_k = (k f_(k-1) + p_(k-1) + q_(k-1)) / (k^2 - mu^2),
+// p_k = p_(k-1)/(k - mu), q_k = q_(k-1)/(k + mu); the starting f_0 holds the
+// limit of the quotient (cos(pi mu) J_mu - J_-mu)/sin(pi mu) through
+// G1 and G2, smooth at mu = 0.
 void TemmeY(f64 mu, f64 x, f64* ymu, f64* ymu1) {
-  const f64 d = -std::log(x / 2);
-  const f64 sigma = mu * d;
+  const f64 lg = -std::log(x / 2);
+  const f64 sigma = mu * lg;
   const f64 g1 = ChebSeries(2 * mu, kTemmeG1), g2 = ChebSeries(2 * mu, kTemmeG2);
-  const f64 rgp = g2 - mu * g1, rgm = g2 + mu * g1;  // 1/Gamma(1 + mu), 1/Gamma(1 - mu)
+  const f64 rgamma_plus = g2 - mu * g1, rgamma_minus = g2 + mu * g1;  // 1/Gamma(1 +- mu)
   const f64 pimu = kPi * mu;
-  const f64 fact = std::fabs(pimu) < 1e-9 ? 1 : pimu / std::sin(pimu);
-  const f64 fact2 = std::fabs(sigma) < 1e-9 ? 1 + sigma * sigma / 6 : std::sinh(sigma) / sigma;
-  const f64 e = std::exp(sigma);
-  f64 ff = kTwoOverPi * fact * (g1 * std::cosh(sigma) + g2 * fact2 * d);
-  f64 p = e / (rgp * kPi), q = 1 / (e * rgm * kPi);
+  const f64 pimu_over_sin = std::fabs(pimu) < 1e-9 ? 1 : pimu / std::sin(pimu);
+  const f64 sinhc = std::fabs(sigma) < 1e-9 ? 1 + sigma * sigma / 6 : std::sinh(sigma) / sigma;
+  const f64 e = std::exp(sigma);  // (2/x)^mu
+  f64 fk = kTwoOverPi * pimu_over_sin * (g1 * std::cosh(sigma) + g2 * sinhc * lg);
+  f64 pk = e / (rgamma_plus * kPi), qk = 1 / (e * rgamma_minus * kPi);
   const f64 half = pimu / 2;
-  const f64 fact3 = std::fabs(half) < 1e-9 ? 1 : std::sin(half) / half;
-  const f64 r = kPi * half * fact3 * fact3;
-  f64 c = 1, sum = ff + r * q, sum1 = p;
-  const f64 dd = -x * x / 4, mu2 = mu * mu;
-  for (int i = 1; i < kMaxTerms; ++i) {
-    ff = (i * ff + p + q) / (i * i - mu2);
-    c *= dd / i;
-    p /= i - mu;
-    q /= i + mu;
-    const f64 del = c * (ff + r * q);
+  const f64 sinc_half = std::fabs(half) < 1e-9 ? 1 : std::sin(half) / half;
+  const f64 r = kPi * half * sinc_half * sinc_half;  // (2/mu) sin^2(pi mu/2)
+  f64 ck = 1, sum = fk + r * qk, sum1 = pk;
+  const f64 z = -x * x / 4, mu2 = mu * mu;
+  for (int k = 1; k < kMaxTerms; ++k) {
+    fk = (k * fk + pk + qk) / (k * k - mu2);
+    ck *= z / k;
+    pk /= k - mu;
+    qk /= k + mu;
+    const f64 del = ck * (fk + r * qk);
     sum += del;
-    const f64 del1 = c * p - i * del;
+    const f64 del1 = ck * pk - k * del;
     sum1 += del1;
     if (std::fabs(del) < kMachEp / 4 * std::fabs(sum) && std::fabs(del1) < kMachEp / 4 * std::fabs(sum1)) break;
   }

@@ -244,8 +244,9 @@ void TemmeY(f64 mu, f64 x, f64* ymu, f64* ymu1) {
 }
 
 // Steed's continued fraction for p + iq = (J'_mu + iY'_mu)/(J_mu + iY_mu),
-// modified Lentz; in long double, since for mu near x it runs about mu terms
-// before it settles.
+// modified Lentz; in long double, since for mu near x it runs some
+// 3 sqrt(x) terms (99 at x = 1000), whose rounding cost up to 5e-14 in
+// double.
 std::complex<f64> SteedCF(f64 mu, f64 x) {
   using C = std::complex<long double>;
   const C tiny(kTiny, 0);

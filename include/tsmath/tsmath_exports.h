@@ -1,6 +1,7 @@
 /* Automatically generated from entries/exports.table, do not edit.
  * Regenerate: cmake -P tools/gen_exports.cmake
  * 206 exports. Included by tsmath.h inside its extern "C" block. */
+ * 208 exports. Included by tsmath.h inside its extern "C" block. */
 #ifndef TSMATH_EXPORTS_H
 #define TSMATH_EXPORTS_H
 
@@ -239,5 +240,9 @@ TSM_API void TS_KelvinI(double x, int32_t n, double* ber, double* bei);
 TSM_API void TS_KelvinK(double x, int32_t n, double* ker, double* kei);
 TSM_API void TS_BesselIr(double v, double x, double* result);
 TSM_API void TS_ParabolicCylinder(double x, double v, double* result);
+TSM_API void TS_BesselJr(double v, double x, double* result);
+TSM_API void TS_BesselYr(double v, double x, double* result);
+TSM_API void TS_BesselJs(int32_t n, double x, double* result);
+TSM_API void TS_BesselYs(int32_t n, double x, double* result);
 
 #endif

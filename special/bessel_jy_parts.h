@@ -1,0 +1,41 @@
+// Pieces of the Bessel J and Y kernels shared by bessel_jy.cpp and
+// bessel_jy_core.cpp. Orders nu >= 0 and x > 0 unless stated.
+#pragma once
+
+#include <cstdint>
+
+#include "frame/types.h"
+
+namespace tsm {
+
+// sin(pi r) and cos(pi r), exact at the multiples of 1/2.
+void SinCosPi(f64 r, f64* s, f64* c);
+
+// Orders 0 and 1 from their Chebyshev sets.
+void BesselJY01(int32 n, f64 x, f64* j, f64* y);
+
+// (x/2)^v / Gamma(v + 1) for any real v that is not a negative integer.
+long double SeriesPrefactor(f64 v, f64 x);
+
+// factor times the power series of J_v, summed in long double.
+f64 BesselJSeries(f64 v, f64 x, long double factor = 1);
+
+// The recurrence C_(m+1) = (2m/x) C_m - C_(m-1) upward, `steps` times from
+// a = C_(m-1), b = C_m, in long double; stops at an infinity.
+long double BesselRecurUp(long double a, long double b, f64 m, f64 x, int64_t steps);
+
+// Hankel's asymptotic expansion; false when its terms do not fall below the
+// rounding before they grow again. y may be null.
+bool BesselJYHankel(f64 nu, f64 x, f64* j, f64* y);
+
+// Where nu < x: Hankel's expansion at the fractional order and the next,
+// then the recurrence upward (neutral there), in long double. False when
+// the expansion declines.
+bool BesselJYUpward(f64 nu, f64 x, f64* j, f64* y);
+
+// Continued fraction for J'/J, downward recurrence to a small order mu, there
+// Temme's series (x < 2) or Steed's continued fraction for Hankel's form
+// (x >= 2) with the Wronskian, then Y upward. y may be null.
+void BesselJYSteed(f64 nu, f64 x, f64* j, f64* y);
+
+}  // namespace tsm

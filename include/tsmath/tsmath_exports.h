@@ -1,6 +1,6 @@
 /* Automatically generated from entries/exports.table, do not edit.
  * Regenerate: cmake -P tools/gen_exports.cmake
- * 204 exports. Included by tsmath.h inside its extern "C" block. */
+ * 205 exports. Included by tsmath.h inside its extern "C" block. */
 #ifndef TSMATH_EXPORTS_H
 #define TSMATH_EXPORTS_H
 
@@ -237,5 +237,6 @@ TSM_API void TS_Airy(double x, double* ai, double* aip, double* bi, double* bip)
 TSM_API void TS_BesselKn(int32_t n, double x, double* result);
 TSM_API void TS_KelvinI(double x, int32_t n, double* ber, double* bei);
 TSM_API void TS_KelvinK(double x, int32_t n, double* ker, double* kei);
+TSM_API void TS_Struve(double x, double v, double* result);
 
 #endif

@@ -48,14 +48,14 @@ struct Estimate {
   f64 error;
 };
 
-// base^p / (sqrt(pi) Gamma(g)), through logarithms when the power or the
-// gamma function alone leave the double range.
+// base^p / (sqrt(pi) Gamma(g)). The power is taken in two halves so that
+// neither it nor the gamma function leaves the double range on the way; only
+// beyond that (Gamma(g) itself infinite) through logarithms.
 f64 PowerOverGamma(f64 base, f64 p, f64 g) {
-  const f64 power = std::pow(base, p);
   const f64 gamma = GammaFn(g);
-  if (std::isfinite(power) && std::isfinite(gamma) && power >= std::numeric_limits<f64>::min())
-    return power / (kSqrtPi * gamma);
-  if (g <= 0) return power / (kSqrtPi * gamma);
+  const f64 half = std::pow(base, p / 2);
+  if (IsFiniteValue(gamma) && IsFiniteValue(half)) return half / (kSqrtPi * gamma) * half;
+  if (g <= 0) return std::pow(base, p) / (kSqrtPi * gamma);
   return std::exp(p * std::log(base) - LogGamma(g)) / kSqrtPi;
 }
 

@@ -1,13 +1,14 @@
-// Gamma-family kernels against the C library's tgamma, lgamma, erf and erfc on
-// the same arguments, in the same run. Read calls per second (items_per_second)
-// of BM_Ours_<f> over BM_Libc_<f>; IncompleteBeta has no libc peer and is
-// reported alone.
+// Special-function kernels against the C library's tgamma, lgamma, erf, erfc
+// and jn on the same arguments, in the same run. Read calls per second
+// (items_per_second) of BM_Ours_<f> over BM_Libc_<f>; IncompleteBeta and
+// Bessel J of non-integer order have no libc peer and are reported alone.
 #include <benchmark/benchmark.h>
 
 #include <cmath>
 #include <random>
 #include <vector>
 
+#include "special/bessel_jy.h"
 #include "special/beta.h"
 #include "special/erf.h"
 #include "special/gamma.h"
@@ -63,6 +64,39 @@ void BM_Ours_IncompleteBeta(benchmark::State& state) {
   state.SetItemsProcessed(state.iterations() * kPoints);
 }
 
+// Bessel J of integer order n (the benchmark's argument) over x in (0, 50).
+const std::vector<double> kBesselArgs = Uniform(0, 50, 8);
+
+void BM_Ours_BesselJn(benchmark::State& state) {
+  const double n = static_cast<double>(state.range(0));
+  for (auto _ : state) {
+    double sum = 0;
+    for (double x : kBesselArgs) sum += tsm::BesselJ(n, x);
+    benchmark::DoNotOptimize(sum);
+  }
+  state.SetItemsProcessed(state.iterations() * kPoints);
+}
+
+void BM_Libc_BesselJn(benchmark::State& state) {
+  const int n = static_cast<int>(state.range(0));
+  for (auto _ : state) {
+    double sum = 0;
+    for (double x : kBesselArgs) sum += jn(n, x);
+    benchmark::DoNotOptimize(sum);
+  }
+  state.SetItemsProcessed(state.iterations() * kPoints);
+}
+
+void BM_Ours_BesselJv(benchmark::State& state) {
+  const std::vector<double> v = Uniform(-10, 30, 9);
+  for (auto _ : state) {
+    double sum = 0;
+    for (int i = 0; i < kPoints; ++i) sum += tsm::BesselJ(v[i], kBesselArgs[i]);
+    benchmark::DoNotOptimize(sum);
+  }
+  state.SetItemsProcessed(state.iterations() * kPoints);
+}
+
 BENCHMARK(BM_Ours_Gamma);
 BENCHMARK(BM_Libc_Gamma);
 BENCHMARK(BM_Ours_LogGamma);
@@ -72,5 +106,8 @@ BENCHMARK(BM_Libc_Erf);
 BENCHMARK(BM_Ours_Erfc);
 BENCHMARK(BM_Libc_Erfc);
 BENCHMARK(BM_Ours_IncompleteBeta);
+BENCHMARK(BM_Ours_BesselJn)->Arg(0)->Arg(1)->Arg(5)->Arg(20);
+BENCHMARK(BM_Libc_BesselJn)->Arg(0)->Arg(1)->Arg(5)->Arg(20);
+BENCHMARK(BM_Ours_BesselJv);
 
 }  // namespace

@@ -5,6 +5,7 @@
 #include "special/airy.h"
 #include "special/bessel_ik.h"
 #include "special/kelvin.h"
+#include "special/struve.h"
 
 using namespace tsm;
 
@@ -18,5 +19,7 @@ void TS_BesselKn(int32_t n, double x, double* result) { *result = BesselK(n, x);
 void TS_KelvinI(double x, int32_t n, double* ber, double* bei) { KelvinI(n, x, ber, bei); }
 
 void TS_KelvinK(double x, int32_t n, double* ker, double* kei) { KelvinK(n, x, ker, kei); }
+
+void TS_Struve(double x, double v, double* result) { *result = StruveH(v, x); }
 
 }  // extern "C"

@@ -2,6 +2,7 @@
  * Regenerate: cmake -P tools/gen_exports.cmake
  * 206 exports. Included by tsmath.h inside its extern "C" block. */
  * 208 exports. Included by tsmath.h inside its extern "C" block. */
+ * 205 exports. Included by tsmath.h inside its extern "C" block. */
 #ifndef TSMATH_EXPORTS_H
 #define TSMATH_EXPORTS_H
 
@@ -244,5 +245,6 @@ TSM_API void TS_BesselJr(double v, double x, double* result);
 TSM_API void TS_BesselYr(double v, double x, double* result);
 TSM_API void TS_BesselJs(int32_t n, double x, double* result);
 TSM_API void TS_BesselYs(int32_t n, double x, double* result);
+TSM_API void TS_Struve(double x, double v, double* result);
 
 #endif

@@ -103,9 +103,17 @@ double KnError(const Row& r) {
   return Err(v, r[2], 0) / ((16 + std::abs(n)) * kEps);
 }
 
+// 16 eps of the envelope the golden file carries: the modulus of J_v and Y_v
+// where H_v oscillates with them, |H_v| elsewhere.
+double StruveError(const Row& r) {
+  double h;
+  TS_Struve(r[1], r[0], &h);
+  return Err(h, r[2], r[3]) / (16 * kEps);
+}
+
 INSTANTIATE_TEST_SUITE_P(Kernels, Golden,
                          ::testing::Values(GoldenCase{"airy", AiryError}, GoldenCase{"kelvin", KelvinError},
-                                           GoldenCase{"kn", KnError}),
+                                           GoldenCase{"kn", KnError}, GoldenCase{"struve", StruveError}),
                          [](const auto& info) { return std::string(info.param.file); });
 
 using tsmtest::ExpectCases;
@@ -141,6 +149,20 @@ TEST(BesselKn, Limits) {
   ExpectCases({{k(0, 0), kInf}, {k(3, 0), kInf}, {k(1, -1), NAN}, {k(2, NAN), NAN}, {k(0, kInf), 0},
                {k(200, 1e-3), kInf},  // overflow in the recurrence
                {k(-4, 3.5), k(4, 3.5)}});
+}
+
+TEST(Struve, Limits) {
+  constexpr double kTwoOverPi = 0.6366197723675814;
+  auto h = [](double v, double x) {
+    double r;
+    TS_Struve(x, v, &r);
+    return r;
+  };
+  ExpectCases({{h(0, 0), 0}, {h(-1, 0), kTwoOverPi}, {h(-2.3, 0), -kInf}, {h(-3.3, 0), kInf},
+               {h(0.5, kInf), 0}, {h(1, kInf), kTwoOverPi}, {h(2, kInf), kInf},
+               {h(2.5, -1), NAN}, {h(NAN, 1), NAN}, {h(1, NAN), NAN},
+               // integer orders: H_v(-x) = (-1)^(v+1) H_v(x)
+               {h(2, -3.5), -h(2, 3.5)}, {h(1, -3.5), h(1, 3.5)}, {h(-3, -40), h(-3, 40)}});
 }
 
 TEST(Kelvin, Limits) {

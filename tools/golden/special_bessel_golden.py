@@ -6,12 +6,15 @@ where the range is wide, plus the break points of the kernels and their
 neighbours. Every float64 is written as a hex float (float.hex()).
 
 Regenerate (Debian's python3 with python3-mpmath and python3-numpy):
-    /usr/bin/python3 tools/golden/special_bessel_golden.py tests/data
+    /usr/bin/python3 tools/golden/special_bessel_golden.py tests/data [airy kelvin kn struve]
 
 Files, one case a line, whitespace-separated:
     special_bessel_airy.txt     x Ai Ai' Bi Bi'
     special_bessel_kelvin.txt   n x ber bei ker kei I_n(|x|)  (ker, kei 0 for x < 0)
     special_bessel_kn.txt       n x K_n(x)  (normal results only)
+    special_bessel_struve.txt   v x H_v(x) envelope  (normal results only; the
+                                envelope is sqrt(J_v^2 + Y_v^2) where x >= |v|
+                                and H oscillates with Y_v, else |H_v|)
 """
 import math
 import os
@@ -28,8 +31,8 @@ def hx(v):
     return float(v).hex()
 
 
-def loguni(a, b, n):
-    return [float(v) for v in np.exp(rng.uniform(math.log(a), math.log(b), n))]
+def loguni(a, b, n, gen=None):
+    return [float(v) for v in np.exp((gen or rng).uniform(math.log(a), math.log(b), n))]
 
 
 def around(points):
@@ -82,11 +85,32 @@ def kn(dirname):
     write(dirname, 'kn', 'n x K_n(x)', rows)
 
 
+def struve_envelope(v, x, h):
+    if x < abs(v):
+        return abs(h)
+    return max(abs(h), mp.hypot(mp.besselj(v, x), mp.bessely(v, x)))
+
+
+def struve(dirname):
+    g = np.random.RandomState(20261125)  # its own stream: regenerated alone
+    pts = [(float(v), x) for v, x in zip(g.uniform(-20, 100, 1200), loguni(1e-3, 1e4, 1200, g))]
+    pts += [(float(n), x) for n, x in zip(g.randint(-10, 60, 400), loguni(1e-3, 1e4, 400, g))]
+    pts += [(float(v), x) for v in (0.0, 1.0, 2.5, 10.3) for x in around([18.0, 30.0])]
+    pts += [(float(n), -x) for n, x in zip(g.randint(-5, 20, 100), loguni(1e-2, 100.0, 100, g))]
+    pts += [(-(n + 0.5), x) for n, x in zip(g.randint(0, 15, 60), loguni(1e-2, 100.0, 60, g))]
+    rows = []
+    for v, x in pts:
+        h = mp.struveh(v, mp.mpf(x))
+        if 2.2250738585072014e-308 < abs(h) < 1.7976931348623157e308:
+            rows.append([v, x, h, struve_envelope(v, abs(x), h)])
+    write(dirname, 'struve', 'v x H_v(x) envelope', rows)
+
+
 def main():
     dirname = sys.argv[1] if len(sys.argv) > 1 else 'tests/data'
-    airy(dirname)
-    kelvin(dirname)
-    kn(dirname)
+    which = sys.argv[2:] or ['airy', 'kelvin', 'kn', 'struve']
+    for name in which:
+        globals()[name](dirname)
 
 
 if __name__ == '__main__':

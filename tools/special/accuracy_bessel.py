@@ -11,16 +11,19 @@ derivatives); on (0, 2.09), where Ai and Ai' are a difference of terms of size
 Bi/sqrt 3, that size. Kelvin functions: relative to the size of the series
 terms that cancel, I_n(x) for ber, bei and (2 + |ln(x/2)| + ln(n + x + 2)) I_n(x)
 for ker, kei, or the modulus where that is larger; the rows "x <= 10" also give
-the error relative to the modulus itself.
+the error relative to the modulus itself. Struve: relative to sqrt(J_v^2 + Y_v^2)
+where x >= |v| (H_v oscillates with Y_v there), or |H_v| where that is larger.
 
-Usage: /usr/bin/python3 tools/special/accuracy_bessel.py build/libtsmath.so [airy|kelvin|kn ...]
+Usage: /usr/bin/python3 tools/special/accuracy_bessel.py build/libtsmath.so [airy|kelvin|kn|struve ...]
 """
 import ctypes
+import math
 import os
 import sys
 
 sys.path.insert(0, os.path.dirname(os.path.abspath(__file__)))
 import mpmath as mp  # noqa: E402
+import numpy as np  # noqa: E402
 import scipy.special as sc  # noqa: E402
 from accuracy_integrals import call, err, logspace, row, with_breaks  # noqa: E402
 
@@ -37,6 +40,7 @@ def lib_funcs(path):
     lib.TS_BesselKn.argtypes = [ctypes.c_int32, D, P]
     lib.TS_KelvinI.argtypes = [D, ctypes.c_int32, P, P]
     lib.TS_KelvinK.argtypes = [D, ctypes.c_int32, P, P]
+    lib.TS_Struve.argtypes = [D, D, P]
     return lib
 
 
@@ -114,10 +118,27 @@ def kn_rows(lib):
                   '%d (n, x), x log-spaced in [1e-6, 705] + breaks, normal results' % len(o), o, t)
 
 
+def struve_rows(lib):
+    g = np.random.RandomState(5)
+    vs = list(g.uniform(-20, 100, 8000)) + list(g.randint(-20, 100, 2000).astype(float))
+    xs = np.exp(g.uniform(math.log(1e-3), math.log(1e4), len(vs)))
+    xs[:40] = [18.0, 30.0] * 20
+    o, t = [], []
+    for v, x in zip(map(float, vs), map(float, xs)):
+        h = mp.struveh(v, x)
+        if not TINY < abs(h) < 1.7976931348623157e308:
+            continue  # outside the normal range no relative accuracy
+        env = mp.hypot(mp.besselj(v, x), mp.bessely(v, x)) if x >= abs(v) else 0
+        o.append(err(call(lib.TS_Struve, x, v), h, env))
+        t.append(err(float(sc.struve(v, x)), h, env))
+    yield row('StruveH', '%d (v, x): v in [-20, 100] (a fifth integers), x log-spaced in [1e-3, 1e4], '
+              'normal results' % len(o), o, t)
+
+
 def main():
     lib = lib_funcs(sys.argv[1] if len(sys.argv) > 1 else 'build/libtsmath.so')
-    which = sys.argv[2:] or ['airy', 'kelvin', 'kn']
-    for name, rows in (('airy', airy_rows), ('kelvin', kelvin_rows), ('kn', kn_rows)):
+    which = sys.argv[2:] or ['airy', 'kelvin', 'kn', 'struve']
+    for name, rows in (('airy', airy_rows), ('kelvin', kelvin_rows), ('kn', kn_rows), ('struve', struve_rows)):
         if name in which:
             for r in rows(lib):
                 print(r)

@@ -1,8 +1,6 @@
 /* Automatically generated from entries/exports.table, do not edit.
  * Regenerate: cmake -P tools/gen_exports.cmake
- * 206 exports. Included by tsmath.h inside its extern "C" block. */
- * 208 exports. Included by tsmath.h inside its extern "C" block. */
- * 205 exports. Included by tsmath.h inside its extern "C" block. */
+ * 211 exports. Included by tsmath.h inside its extern "C" block. */
 #ifndef TSMATH_EXPORTS_H
 #define TSMATH_EXPORTS_H
 

@@ -215,7 +215,7 @@ void SpecialValues() {
     double value;
     double exact;
   };
-  double v[10];
+  double v[16];
   ENTRY(TS_Gamma)(0.5, NAN, &v[0]);
   ENTRY(TS_LnGamma)(100.0, &v[1]);
   ENTRY(TS_Psi)(1.0, &v[2]);
@@ -226,6 +226,12 @@ void SpecialValues() {
   ENTRY(TS_Diln)(0.5, &v[7]);
   ENTRY(TS_ExpI)(1.0, 1, &v[8]);
   ENTRY(TS_Fact)(20, &v[9]);
+  ENTRY(TS_BesselJr)(0.5, M_PI / 2, &v[10]);
+  ENTRY(TS_BesselYs)(0, 1.0, &v[11]);
+  ENTRY(TS_BesselIr)(0.5, 1.0, &v[12]);
+  ENTRY(TS_BesselKn)(0, 1.0, &v[13]);
+  ENTRY(TS_Struve)(M_PI, 0.5, &v[14]);
+  ENTRY(TS_ParabolicCylinder)(1.0, 1.0, &v[15]);
   const Row rows[] = {
       {"Gamma(1/2)", v[0], std::sqrt(M_PI)},
       {"ln Gamma(100)", v[1], 359.13420536957539878},
@@ -237,6 +243,12 @@ void SpecialValues() {
       {"dilogarithm(1/2)", v[7], M_PI * M_PI / 12 - M_LN2 * M_LN2 / 2},
       {"E1(1)", v[8], 0.21938393439552027368},
       {"20!", v[9], 2432902008176640000.0},
+      {"J_1/2(pi/2)", v[10], 2 / M_PI},
+      {"y_0(1)", v[11], -std::cos(1.0)},
+      {"I_1/2(1)", v[12], std::sqrt(2 / M_PI) * std::sinh(1.0)},
+      {"K_0(1)", v[13], 0.42102443824070833334},
+      {"H_1/2(pi)", v[14], 2 * std::sqrt(2 / (M_PI * M_PI))},
+      {"D_1(1)", v[15], std::exp(-0.25)},
   };
   std::printf("  special functions (TS_ entries) beside closed forms:      relative error\n");
   for (const Row& r : rows)

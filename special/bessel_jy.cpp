@@ -8,7 +8,9 @@
 //   domain error (NaN). J_v(0) is 1 for v = 0, 0 for v > 0 or v a negative
 //   integer, and an infinity of the sign of Gamma(v + 1) otherwise
 //   (singularity). Orders 0 and 1 have their own Chebyshev kernels
-//   (special/bessel_jy_core.cpp). For nu = |v| otherwise:
+//   (special/bessel_jy_core.cpp); other integer orders n recur from them:
+//   upward below x (as Y does), downward from the continued fraction for
+//   J'_n/J_n above x and beyond the power series. For nu = |v| otherwise:
 //     x^2 < (nu + 1) MACHEP:  (x/2)^v / Gamma(v + 1);
 //     deep below the turning point (Debye's leading exponent above 760):
 //                             J = 0, Y = -inf;
@@ -167,6 +169,13 @@ f64 BesselJ(f64 v, f64 x) {
     BesselJY01(static_cast<int32>(v), x, &j, nullptr);
     return sign * j;
   }
+  if (integer && v < x) {  // the recurrence upward from J0 and J1 is neutral below x
+    f64 a, b;
+    BesselJY01(0, x, &a, nullptr);
+    BesselJY01(1, x, &b, nullptr);
+    return sign * static_cast<f64>(BesselRecurUp(a, b, 1, x, static_cast<int64_t>(v) - 1));
+  }
+  if (integer && !BeyondRange(v, x) && x >= SeriesLimit(v)) return sign * BesselJIntegerDown(static_cast<int64_t>(v), x);
   if (integer) {
     f64 j;
     JYNonNegative(v, x, &j, nullptr);

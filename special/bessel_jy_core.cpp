@@ -84,21 +84,19 @@ void HankelPhase(f64 nu, f64 x, f64* cchi, f64* schi) {
 void BesselJY01(int32 n, f64 x, f64* j, f64* y) {
   if (x <= 8) {
     const f64 t = x * x / 32 - 1;
+    *j = n == 0 ? ChebSeries(t, kJ0Small) : x * ChebSeries(t, kJ1Small);
+    if (!y) return;
     const f64 l = kTwoOverPi * std::log(x / 2);
-    if (n == 0) {
-      *j = ChebSeries(t, kJ0Small);
-      if (y) *y = ChebSeries(t, kY0Small) + l * *j;
-    } else {
-      *j = x * ChebSeries(t, kJ1Small);
-      if (y) *y = (ChebSeries(t, kY1Small) + x * l * *j) / x;
-    }
+    *y = n == 0 ? ChebSeries(t, kY0Small) + l * *j : (ChebSeries(t, kY1Small) + x * l * *j) / x;
     return;
   }
   const f64 t = 128 / (x * x) - 1;
   const f64 p = n == 0 ? ChebSeries(t, kP0Large) : ChebSeries(t, kP1Large);
   const f64 q = 8 / x * (n == 0 ? ChebSeries(t, kQ0Large) : ChebSeries(t, kQ1Large));
-  f64 c, s;
-  HankelPhase(n, x, &c, &s);
+  // chi = x - pi/4 or x - 3 pi/4: cos chi and sin chi from cos x and sin x
+  const f64 cx = std::cos(x), sx = std::sin(x);
+  const f64 ca = n == 0 ? kSqrtHalf : -kSqrtHalf;
+  const f64 c = (cx * ca + sx * kSqrtHalf), s = (sx * ca - cx * kSqrtHalf);
   const f64 k = std::sqrt(kTwoOverPi / x);
   *j = k * (p * c - q * s);
   if (y) *y = k * (p * s + q * c);
@@ -106,6 +104,13 @@ void BesselJY01(int32 n, f64 x, f64* j, f64* y) {
 
 long double SeriesPrefactor(f64 v, f64 x) {
   const long double h = static_cast<long double>(x) / 2;
+  if (v >= 0 && v <= 1700 && v == std::floor(v)) {
+    // (x/2)^n / n! as a product: far cheaper than the power and the gamma
+    // function, and within long double's range wherever the result is.
+    long double t = 1;
+    for (int k = 1; k <= static_cast<int>(v) && t != 0; ++k) t *= h / k;
+    return t;
+  }
   const long double lp = v * std::log(h);
   // Within these bounds neither the power nor the gamma function leaves the
   // long double range; beyond them, through logarithms.
@@ -272,30 +277,63 @@ std::complex<f64> SteedCF(f64 mu, f64 x) {
 
 }  // namespace
 
-void BesselJYSteed(f64 nu, f64 x, f64* j, f64* y) {
+namespace {
+
+// The recurrence downward from J_nu = sign, J'_nu = sign f over `steps`
+// orders, in long double, rescaled by 2^-800 when it grows past 2^800.
+struct Downward {
+  long double j, jp;  // J and J' at the last order, unnormalised
+  int64_t scale = 0;  // number of rescalings
+};
+
+Downward RecurDown(f64 nu, f64 x, int64_t steps, int sign, f64 f) {
   using L = long double;
+  const L xi = 1 / static_cast<L>(x);
+  Downward d{static_cast<L>(sign), static_cast<L>(sign) * f};
+  L k = nu;
+  for (int64_t l = 0; l < steps; ++l) {
+    const L jm = k * xi * d.j + d.jp;
+    k -= 1;
+    d.jp = k * xi * jm - d.j;
+    d.j = jm;
+    if (std::fabs(d.j) > kRescaleAt) {
+      d.j = std::ldexp(d.j, -kRescaleExp);
+      d.jp = std::ldexp(d.jp, -kRescaleExp);
+      ++d.scale;
+    }
+  }
+  return d;
+}
+
+// r times 2^(-800 scale).
+f64 Unscaled(long double r, int64_t scale) {
+  return static_cast<f64>(scale > 0 ? std::ldexp(r, static_cast<int>(std::max<int64_t>(-100000, -scale * kRescaleExp)))
+                                    : r);
+}
+
+}  // namespace
+
+f64 BesselJIntegerDown(int64_t n, f64 x) {
+  int sign;
+  const f64 f = RatioCF(static_cast<f64>(n), x, &sign);
+  const Downward d = RecurDown(static_cast<f64>(n), x, n, sign, f);
+  // d.j is J_0 and -d.jp is J_1, unnormalised: scale by the larger one.
+  f64 j0, j1;
+  BesselJY01(0, x, &j0, nullptr);
+  BesselJY01(1, x, &j1, nullptr);
+  const long double r = std::fabs(j0) >= std::fabs(j1) ? sign * (j0 / d.j) : sign * (j1 / -d.jp);
+  return Unscaled(r, d.scale);
+}
+
+void BesselJYSteed(f64 nu, f64 x, f64* j, f64* y) {
   const f64 steps = x < 2 ? std::floor(nu + 0.5) : std::fmax(0, std::floor(nu - x + 1.5));
   const int64_t nl = static_cast<int64_t>(steps);
   const f64 mu = nu - steps;
   int sign;
   const f64 f = RatioCF(nu, x, &sign);
-  // downward from nu with J_nu = sign, J'_nu = sign f
-  const L xi = 1 / static_cast<L>(x);
-  L jl = sign, jpl = sign * f, k = nu;
-  int64_t scale = 0;
-  for (int64_t l = 0; l < nl; ++l) {
-    const L jm = k * xi * jl + jpl;
-    k -= 1;
-    jpl = k * xi * jm - jl;
-    jl = jm;
-    if (std::fabs(jl) > kRescaleAt) {
-      jl = std::ldexp(jl, -kRescaleExp);
-      jpl = std::ldexp(jpl, -kRescaleExp);
-      ++scale;
-    }
-  }
+  const Downward d = RecurDown(nu, x, nl, sign, f);
   const f64 w = kTwoOverPi / x;  // the Wronskian J Y' - J' Y
-  const f64 fmu = static_cast<f64>(jpl / jl);
+  const f64 fmu = static_cast<f64>(d.jp / d.j);
   f64 jmu, ymu, ymu1;
   if (x < 2) {
     TemmeY(mu, x, &ymu, &ymu1);
@@ -305,14 +343,13 @@ void BesselJYSteed(f64 nu, f64 x, f64* j, f64* y) {
     const std::complex<f64> pq = SteedCF(mu, x);
     const f64 p = pq.real(), q = pq.imag();
     const f64 gamma = (p - fmu) / q;
-    jmu = std::copysign(std::sqrt(w / (q * (1 + gamma * gamma))), static_cast<f64>(jl));
+    jmu = std::copysign(std::sqrt(w / (q * (1 + gamma * gamma))), static_cast<f64>(d.j));
     ymu = gamma * jmu;
     const f64 ypmu = p * ymu + q * jmu;
     ymu1 = mu / x * ymu - ypmu;
   }
   // J_nu = J_mu times (J_nu / J_mu) of the unnormalised recurrence
-  const L r = sign * (jmu / jl);
-  *j = static_cast<f64>(scale > 0 ? std::ldexp(r, static_cast<int>(std::max<int64_t>(-100000, -scale * kRescaleExp))) : r);
+  *j = Unscaled(sign * (jmu / d.j), d.scale);
   if (!y) return;
   *y = static_cast<f64>(nl == 0 ? ymu : BesselRecurUp(ymu, ymu1, mu + 1, x, nl - 1));
   if (!std::isfinite(*y)) *y = -std::numeric_limits<f64>::infinity();

@@ -38,4 +38,9 @@ bool BesselJYUpward(f64 nu, f64 x, f64* j, f64* y);
 // (x >= 2) with the Wronskian, then Y upward. y may be null.
 void BesselJYSteed(f64 nu, f64 x, f64* j, f64* y);
 
+// J_n for an integer n >= 2 and 0 < x <= n: the same fraction and downward
+// recurrence to orders 1 and 0, normalised by the larger of J0 and J1 from
+// their kernels.
+f64 BesselJIntegerDown(int64_t n, f64 x);
+
 }  // namespace tsm

@@ -25,12 +25,9 @@ sys.path.insert(0, os.path.dirname(os.path.abspath(__file__)))
 import mpmath as mp  # noqa: E402
 import numpy as np  # noqa: E402
 import scipy.special as sc  # noqa: E402
-from accuracy_integrals import call, err, logspace, row, with_breaks  # noqa: E402
+from accuracy_integrals import D, P, TINY, call, err, logspace, row, with_breaks  # noqa: E402
 
 mp.mp.dps = 40
-D = ctypes.c_double
-P = ctypes.POINTER(D)
-TINY = 2.2250738585072014e-308
 
 
 def lib_funcs(path):

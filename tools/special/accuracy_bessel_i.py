@@ -26,13 +26,10 @@ sys.path.insert(0, here)
 sys.path.insert(0, os.path.join(here, '..', 'golden'))
 import mpmath as mp  # noqa: E402
 import scipy.special as sc  # noqa: E402
-from accuracy_integrals import call, err, logspace, row  # noqa: E402
+from accuracy_integrals import D, HUGE, P, TINY, call, err, logspace, row  # noqa: E402
 from special_bessel_i_golden import iv_envelope, pcfd_envelope  # noqa: E402
 
 mp.mp.dps = 40
-D = ctypes.c_double
-P = ctypes.POINTER(D)
-TINY, HUGE = 2.2250738585072014e-308, 1.7976931348623157e308
 rng = np.random.RandomState(7)
 
 

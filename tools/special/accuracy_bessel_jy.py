@@ -27,14 +27,10 @@ sys.path.insert(0, os.path.join(HERE, '..', 'golden'))
 import mpmath as mp  # noqa: E402
 import numpy as np  # noqa: E402
 import scipy.special as sc  # noqa: E402
-from accuracy_integrals import call, logspace, row, with_breaks  # noqa: E402
+from accuracy_integrals import D, HUGE, P, TINY, call, logspace, row, with_breaks  # noqa: E402
 from special_bessel_jy_golden import reference  # noqa: E402
 
 mp.mp.dps = 40
-D = ctypes.c_double
-P = ctypes.POINTER(D)
-TINY = 2.2250738585072014e-308
-HUGE = 1.7976931348623157e308
 LIB = None
 
 

@@ -23,6 +23,8 @@ import scipy.special as sc
 mp.mp.dps = 40
 D = ctypes.c_double
 P = ctypes.POINTER(D)
+TINY = 2.2250738585072014e-308  # smallest normal double
+HUGE = 1.7976931348623157e308
 
 
 def lib_funcs(path):
@@ -153,7 +155,6 @@ def main():
         oe.append(err(call(lib.TS_Elliptic2_85, m, 0.0, tail=(1,)), re))
         te.append(err(sc.ellipe(m), re))
     main_k = [i for i, m in enumerate(ms) if 1 - m >= 7e-6]
-    two_term = [i for i, m in enumerate(ms) if 1 - m < 7e-6]
     rows.append(row('EllipticK', '%d m: linear in [0, 1) and 1 - log-spaced q in [7e-6, 1]' % len(main_k),
                     [ok[i] for i in main_k], [tk[i] for i in main_k]))
     rows.append(row('EllipticK, q = 1 - m below 7e-6 (two-term form)', '%d m: 1 - log-spaced q in [1e-16, 7e-6)' % len(ok2),

@@ -457,13 +457,8 @@ TEST_F(Measure, ListsComeFromTheWorkspace) {
   const Call c{0, 1, 2};
   const Outcome heap = RunPulse(x, c);
   for (uint32_t size : {1u << 16, 48u}) {
-    ErrorCluster err{0, 0};
-    InitializeAnalysisWorkspaceH(size, &err);
-    EnableAnalysisWorkspaceH(&err);
+    tsmtest::ScopedWorkspace ws(size);
     const Outcome pulse = RunPulse(x, c), trans = RunTrans(x, c);
-    DisableAnalysisWorkspaceH(&err);
-    UninitializeAnalysisWorkspaceH(&err);
-    ASSERT_EQ(err.status, 0);
     EXPECT_EQ(pulse.code, size > 48 ? 0 : TSM_ERR_NO_PULSE);
     EXPECT_EQ(trans.code, size > 48 ? 0 : TSM_ERR_NO_PULSE);
     if (size > 48) {

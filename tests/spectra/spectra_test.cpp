@@ -14,6 +14,9 @@
 
 #include "entries/fft_state.h"
 #include "support/host_arrays.h"
+#include "support/host_fixture.h"
+#include "support/host_matrix.h"
+#include "support/random_data.h"
 #include "support/reference_dft.h"
 
 namespace tsmtest {
@@ -37,19 +40,6 @@ double ScaledError(const Out& got, const Out& want) {
   return static_cast<double>(err / (scale > 0 ? scale : 1));
 }
 
-V RandomReal(int n, unsigned seed) {
-  std::mt19937 rng(seed);
-  std::uniform_real_distribution<double> u(-1, 1);
-  V v(std::max(n, 0));
-  for (double& x : v) x = u(rng);
-  return v;
-}
-std::vector<cx> RandomCx(int n, unsigned seed) {
-  const V re = RandomReal(n, seed), im = RandomReal(n, seed + 1000);
-  std::vector<cx> v;
-  for (size_t i = 0; i < re.size(); ++i) v.push_back(cx{re[i], im[i]});
-  return v;
-}
 Out AsOut(const V& v) { return Out(v.begin(), v.end()); }
 Out AsOut(const std::vector<cx>& v) {
   Out o;
@@ -65,15 +55,7 @@ struct States {
   ~States() { TransformUnreserveProc(&reserved); }
 };
 
-class Entries : public ::testing::Test {
- protected:
-  void SetUp() override { blocks_ = tsrt_live_blocks(); }
-  void TearDown() override {
-    tsrt_end_run();
-    EXPECT_EQ(tsrt_live_blocks(), blocks_);
-  }
-  int64_t blocks_ = 0;
-};
+using Entries = HostRunTest;
 
 // ---- Spectra, Hilbert and Hartley ------------------------------------------
 
@@ -225,9 +207,7 @@ TEST_F(Entries, SpectraRefusedResizeGivesNoMemoryAndAnEmptyOutput) {
 }
 
 TEST_F(Entries, ScratchComesFromTheHeapNotTheWorkspace) {
-  ErrorCluster e{0, 0};
-  InitializeAnalysisWorkspaceH(64, &e);
-  EnableAnalysisWorkspaceH(&e);
+  ScopedWorkspace ws(64);
   const Data d(15, 15);  // plans of 15, 30 and 32 points take no scratch of their own
   for (const Case& c : Cases()) {
     States s;
@@ -238,9 +218,6 @@ TEST_F(Entries, ScratchComesFromTheHeapNotTheWorkspace) {
   PlanHolder* state = nullptr;
   EXPECT_EQ(DCT_1DH(x.Handle(), y.Handle(), 0, &state), 0);
   EXPECT_EQ(DST_1DH(x.Handle(), y.Handle(), 0, &state), 0);
-  DisableAnalysisWorkspaceH(&e);
-  UninitializeAnalysisWorkspaceH(&e);
-  EXPECT_EQ(e.status, 0);
 }
 
 // ---- DCT and DST -------------------------------------------------------------
@@ -283,28 +260,7 @@ V Samples(int count, long long a, long long b, long long c) {
   return x;
 }
 
-class HostMatrix {
- public:
-  HostMatrix(int rows, int cols, const V& v)
-      : h_(static_cast<MatrixHdl>(tsrt_new_matrix(TSM_TYPE_F64, rows, cols, v.empty() ? nullptr : v.data()))) {}
-  HostMatrix(const HostMatrix&) = delete;
-  HostMatrix& operator=(const HostMatrix&) = delete;
-  ~HostMatrix() { tsrt_dispose(h_); }
-  MatrixHdl Handle() const { return h_; }
-  int Dim(int d) const {
-    int32_t v;
-    std::memcpy(&v, reinterpret_cast<const char*>(*h_) + 4 * d, 4);
-    return v;
-  }
-  V Values() const {
-    V v(static_cast<size_t>(std::max(Dim(0) * Dim(1), 0)));
-    if (!v.empty()) std::memcpy(v.data(), reinterpret_cast<const char*>(*h_) + 8, v.size() * sizeof(double));
-    return v;
-  }
-
- private:
-  MatrixHdl h_;
-};
+using HostMatrix = Mat;
 
 // The entries of a kind; the inverses, which have no sizes, are called
 // through forms that take and drop them.

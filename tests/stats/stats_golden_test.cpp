@@ -268,31 +268,6 @@ void CheckAll() {
   CheckGeneralHistograms();
 }
 
-// Enables an analysis workspace of the given size for its lifetime. Removing
-// it afterwards fails while any block is still out, so a leak shows here.
-class Workspace {
- public:
-  explicit Workspace(uint32_t bytes) {
-    InitializeAnalysisWorkspaceH(bytes, &cl_);
-    EnableAnalysisWorkspaceH(&cl_);
-    Expect("enable");
-  }
-  ~Workspace() {
-    DisableAnalysisWorkspaceH(&cl_);
-    UninitializeAnalysisWorkspaceH(&cl_);
-    Expect("remove");
-  }
-
- private:
-  void Expect(const char* what) {
-    const uint8_t status = cl_.status;
-    const int32_t code = cl_.code;
-    EXPECT_EQ(status, 0) << what;
-    EXPECT_EQ(code, 0) << what;
-  }
-  ErrorCluster cl_{};
-};
-
 TEST(StatsGolden, FileIsComplete) {
   const Golden& g = TheGolden();
   EXPECT_EQ(g.sets.size(), 11u);
@@ -313,14 +288,14 @@ TEST(StatsGolden, Modes) { CheckModes(); }
 TEST(StatsGolden, GeneralHistogram) { CheckGeneralHistograms(); }
 
 TEST(StatsArena, SameResultsFromTheWorkspace) {
-  Workspace ws(1u << 20);
+  tsmtest::ScopedWorkspace ws(1u << 20);
   CheckAll();
 }
 
 TEST(StatsArena, ExhaustedWorkspaceGivesNoMemory) {
   const std::vector<double>& big = TheGolden().sets.at("u1000");
   F64 x(big), two{1.0, 3.0};
-  Workspace ws(256);
+  tsmtest::ScopedWorkspace ws(256);
   const Scalar r = CallScalar([&](double* v, int32_t* e) { return Median_head(x.Handle(), v, e); });
   EXPECT_EQ(r.ret, 0);
   EXPECT_EQ(r.err, TSM_ERR_NO_MEMORY);

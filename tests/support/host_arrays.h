@@ -124,4 +124,27 @@ inline Scalar CallScalar(const std::function<int32_t(double*, int32_t*)>& call) 
   return r;
 }
 
+// An analysis workspace of `bytes`, enabled for the scope. Removing it fails
+// while a scratch block is still out, so a leak shows here.
+class ScopedWorkspace {
+ public:
+  explicit ScopedWorkspace(uint32_t bytes) {
+    InitializeAnalysisWorkspaceH(bytes, &e_);
+    EnableAnalysisWorkspaceH(&e_);
+    const int status = e_.status;
+    EXPECT_EQ(status, 0) << "workspace not made";
+  }
+  ~ScopedWorkspace() {
+    DisableAnalysisWorkspaceH(&e_);
+    UninitializeAnalysisWorkspaceH(&e_);
+    const int status = e_.status;
+    EXPECT_EQ(status, 0) << "scratch left live in the arena";
+  }
+  ScopedWorkspace(const ScopedWorkspace&) = delete;
+  ScopedWorkspace& operator=(const ScopedWorkspace&) = delete;
+
+ private:
+  ErrorCluster e_{0, 0};
+};
+
 }  // namespace tsmtest

@@ -292,10 +292,7 @@ TEST_F(WindowEntries, MeasuredConstantsOfArrays) {
 // Scratch exhausted in arena mode: -20001 and an emptied array; windows that
 // take no scratch still work.
 TEST_F(WindowEntries, ArenaExhaustion) {
-  ErrorCluster e{0, 0};
-  InitializeAnalysisWorkspaceH(256, &e);
-  EnableAnalysisWorkspaceH(&e);
-  ASSERT_EQ(e.status, 0);
+  ScopedWorkspace ws(256);
   static WinConsts k;
   const std::vector<Named> needy = {
       {"AllCosWinH", [](F64ArrayHdl x) { return AllCosWinH(x, 8, 0); }},
@@ -316,9 +313,6 @@ TEST_F(WindowEntries, ArenaExhaustion) {
   F64 x(V(100, 1.0));
   EXPECT_EQ(KaiserH(x.Handle(), 4.0), 0);
   EXPECT_EQ(x.Count(), 100);
-  DisableAnalysisWorkspaceH(&e);
-  UninitializeAnalysisWorkspaceH(&e);
-  EXPECT_EQ(e.status, 0) << "scratch left live in the arena";
 }
 
 }  // namespace

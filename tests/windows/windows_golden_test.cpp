@@ -23,6 +23,7 @@
 #include <fstream>
 #include <functional>
 #include <map>
+#include <optional>
 #include <random>
 #include <sstream>
 #include <string>
@@ -238,19 +239,10 @@ void CheckScaledCosineSums() {
 class WindowsGolden : public ::testing::TestWithParam<bool> {
  protected:
   void SetUp() override {
-    if (!GetParam()) return;
-    ErrorCluster e{0, 0};
-    InitializeAnalysisWorkspaceH(1 << 20, &e);
-    EnableAnalysisWorkspaceH(&e);
-    ASSERT_EQ(e.status, 0);
+    if (GetParam()) arena_.emplace(1 << 20);
   }
-  void TearDown() override {
-    if (!GetParam()) return;
-    ErrorCluster e{0, 0};
-    DisableAnalysisWorkspaceH(&e);
-    UninitializeAnalysisWorkspaceH(&e);
-    EXPECT_EQ(e.code, 0) << "scratch left live in the arena";
-  }
+  void TearDown() override { arena_.reset(); }
+  std::optional<ScopedWorkspace> arena_;
 };
 
 TEST_P(WindowsGolden, WindowsMatchReferences) { CheckWindows(); }

@@ -158,10 +158,7 @@ TEST_F(Measure, HistogramStatesFollowTheSideRules) {
     return v;
   };
   // 10 bins over [0, 10]: bin b is centred on b + 0.5.
-  struct Case {
-    V x;
-    double low, high;
-  } cases[] = {
+  struct Case { V x; double low, high; } cases[] = {
       {rep({{0, 3}, {2.5, 3}, {5.5, 10}, {7.5, 3}, {10, 3}}), 0.5, 9.5},  // ties go outward, bin 5 ignored
       {rep({{0, 3}, {4.5, 4}, {5.5, 10}, {6.5, 4}, {10, 3}}), 4.5, 6.5},  // bins 4 and 6 still count
       {rep({{0, 1}, {1.5, 2}, {8.5, 2}, {10, 1}}), 1.5, 8.5},
@@ -188,10 +185,7 @@ TEST_F(Measure, AutomaticLevelsNeedPopulatedSides) {
     x.push_back(10);
     return x;
   };
-  struct Case {
-    int lowCount, highCount, option;
-    double low, high;
-  } cases[] = {
+  struct Case { int lowCount, highCount, option; double low, high; } cases[] = {
       {4, 20, 0, 0, 9.5}, {5, 20, 0, 0.5, 9.5}, {10, 4, 0, 0.5, 10},
       {10, 20, 1, 0.5, 9.5}, {10, 4, 1, 0, 10}, {4, 20, 1, 0, 10},
   };
@@ -285,10 +279,7 @@ TEST_F(Measure, FetchGivesEverySelector) {
   const double rms = std::sqrt(LongSumSquares(x, 0, 400) / 400);
   const double cycleRms = std::sqrt(LongSumSquares(x, 0, 100) / 100);
   constexpr double nan = std::numeric_limits<double>::quiet_NaN();
-  struct Case {
-    int32_t selector;
-    double value, start = nan, end = nan;
-  } cases[] = {
+  struct Case { int32_t selector; double value, start = nan, end = nan; } cases[] = {
       {0, -0.05}, {1, 1.15}, {2, 1.2}, {3, 0}, {4, 1}, {5, 1}, {6, 1}, {7, 0}, {8, 1},
       {9, 0.1}, {10, 0.5}, {11, 0.9}, {12, 0.4}, {13, rms}, {14, LongMean(x, 0, 400)},
       {15, 100 * dt}, {16, 1 / (100 * dt)},
@@ -385,11 +376,7 @@ TEST_F(Measure, FailuresLeaveTheirOutputsZero) {
     return c;
   };
   const Call base = with([](Call&) {});
-  struct Case {
-    const char* what;
-    Run run;
-    int32_t code;
-  } cases[] = {
+  struct Case { const char* what; Run run; int32_t code; } cases[] = {
       {"no record", pulse(wave, with([](Call& c) { c.noRecord = true; })), TSM_ERR_MISSING_RECORD},
       {"no bins", pulse(wave, with([](Call& c) { c.how.bins = 0; })), TSM_ERR_BIN_COUNT},
       {"method 3", trans(wave, with([](Call& c) { c.how.method = 3; })), TSM_ERR_METHOD_SELECTOR},

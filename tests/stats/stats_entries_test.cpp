@@ -1,14 +1,10 @@
 // The statistics entries on hand-made data with known answers, and their
 // frame: empty inputs, stale outputs, refused resizes, moving blocks.
-// TSM_ALWAYS_MOVE in the environment makes the host move every block at
-// every resize for the whole run.
 #include <gtest/gtest.h>
 
 #include <algorithm>
 #include <array>
-#include <bit>
 #include <cmath>
-#include <cstdlib>
 #include <functional>
 #include <limits>
 #include <optional>
@@ -30,13 +26,6 @@ using tsmtest::kEps;
 using tsmtest::IsLibNaN;
 using tsmtest::Scalar;
 using tsmtest::CallScalar;
-const bool gAlwaysMove = [] {
-  const bool on = std::getenv("TSM_ALWAYS_MOVE") != nullptr;
-  tsrt_always_move(on);
-  return on;
-}();
-
-
 
 // Entry runs with stale outputs of a non-zero count.
 struct ModeOut {
@@ -389,7 +378,7 @@ TEST(StatsFrame, BlocksThatMoveAtEveryResize) {
   const auto still = runAll();
   tsrt_always_move(1);
   const auto moving = runAll();
-  tsrt_always_move(gAlwaysMove);
+  tsrt_always_move(0);
   EXPECT_EQ(still, moving);
   EXPECT_EQ(moving, std::tuple(3.5, ModeOut{0, {1}}, ModeOut{0, {1, 7}}, HistOut{0, 0, {3, 2, 2, 3}, {1, 3, 5, 7}},
                                GenHistOut{0, 0, {3, 4, 0}, {3, 0, 2}}));

@@ -28,10 +28,7 @@ V DirectConvolution(const V& a, const V& b) {
 using ConvEntries = HostRunTest;
 
 TEST_F(ConvEntries, FormAChecksAndEmptiesTheOutput) {
-  struct Case {
-    int n, m;
-    int32_t alg, norm, want;
-  } cases[] = {
+  struct Case { int n, m; int32_t alg, norm, want; } cases[] = {
       {0, 3, 0, 0, TSM_ERR_EMPTY}, {3, 0, 1, 0, TSM_ERR_EMPTY},
       {3, 4, 0, 3, TSM_ERR_BAD_SELECTOR},  // unknown normalization, after the sums
       {3, 4, 1, -1, TSM_ERR_BAD_SELECTOR}, {3, 4, 5, 9, TSM_ERR_BAD_SELECTOR},
@@ -62,10 +59,7 @@ TEST_F(ConvEntries, FormAChecksAndEmptiesTheOutput) {
 
 TEST_F(ConvEntries, ComplexConvolutionChecks) {
   Cx x{cx{1, 1}, cx{2, 0}}, y{cx{0, 1}}, empty;
-  struct Case {
-    Cx* a;
-    int32_t alg, correlate, norm, want;
-  } cases[] = {
+  struct Case { Cx* a; int32_t alg, correlate, norm, want; } cases[] = {
       {&x, 0, 1, 3, TSM_ERR_BAD_SELECTOR},     {&empty, 0, 1, -1, TSM_ERR_BAD_SELECTOR},  // before the sizes
       {&empty, 0, 0, 77, TSM_ERR_EMPTY},       {&x, 2, 0, 0, TSM_ERR_BAD_SELECTOR},
       {&x, 0, 0, 77, TSM_SUCCESS},             {&x, 1, 1, 2, TSM_SUCCESS},
@@ -78,10 +72,7 @@ TEST_F(ConvEntries, ComplexConvolutionChecks) {
 }
 
 TEST_F(ConvEntries, MatrixChecksInOrder) {
-  struct Case {
-    int r1, c1, r2, c2;
-    int32_t size, alg, want;
-  } cases[] = {
+  struct Case { int r1, c1, r2, c2; int32_t size, alg, want; } cases[] = {
       {0, 2, 2, 2, 9, 0, TSM_ERR_EMPTY},      {2, 2, 2, 0, 0, 0, TSM_ERR_EMPTY},
       {2, 2, 2, 2, 3, 0, TSM_ERR_BAD_SELECTOR}, {2, 2, 2, 2, -1, 0, TSM_ERR_BAD_SELECTOR},
       {2, 3, 3, 2, 2, 0, TSM_ERR_SIZE_PAIR},  {2, 2, 2, 2, 2, 7, TSM_ERR_BAD_SELECTOR},
@@ -136,11 +127,7 @@ TEST_F(ConvEntries, AutoCorrelationMatchesRxyWithZeroLagAtTheMiddle) {
 }
 
 TEST_F(ConvEntries, DeconvolutionRecoversTheQuotientByEitherPath) {
-  struct Case {
-    V y;
-    int q;
-    const char* path;
-  } cases[] = {
+  struct Case { V y; int q; const char* path; } cases[] = {
       {{2.0, -0.5, 0.25}, 40, "spectral"},
       {{1.5}, 1, "spectral, one sample"},
       {RandomReal(9, 3), 1, "spectral, n == m"},

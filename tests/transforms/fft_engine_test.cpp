@@ -145,10 +145,7 @@ void ExpectAccurate(int n) {
 }
 
 TEST(KwfftPlan, FactorListsAndKinds) {
-  struct Case {
-    int n;
-    std::vector<int> factors, kinds;
-  };
+  struct Case { int n; std::vector<int> factors, kinds; };
   const Case cases[] = {
       {60, {2, 3, 10}, {0, 0, 0}},          {1000, {10, 10, 10}, {0, 0, 0}},
       {64, {2, 32}, {0, 0}},                {1024, {32, 32}, {0, 0}},

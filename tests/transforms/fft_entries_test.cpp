@@ -79,9 +79,7 @@ TEST_F(FftEntries, ForwardEntriesMatchTheReferenceWindow) {
 }
 
 TEST_F(FftEntries, ChecksInOrderAndEmptyTheOutput) {
-  struct Case {
-    int n, offset, fftSize, want;
-  } cases[] = {
+  struct Case { int n, offset, fftSize, want; } cases[] = {
       {0, 5, 0, TSM_ERR_EMPTY},         // empty input first
       {4, 4, 8, TSM_ERR_INDEX_RANGE},   // offset equal to the count
       {4, -1, 8, TSM_ERR_INDEX_RANGE},

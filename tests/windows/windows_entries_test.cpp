@@ -94,11 +94,7 @@ TEST_F(WindowEntries, EmptyAndSingleSampleArrays) {
 TEST_F(WindowEntries, KernelFailuresEmptyTheArray) {
   WinConsts k{1, 1};
   F64 none;
-  struct Case {
-    const char* what;
-    int32_t want;
-    RealCall call;
-  } cases[] = {
+  struct Case { const char* what; int32_t want; RealCall call; } cases[] = {
       {"AllCos selector 10", TSM_ERR_BAD_SELECTOR, [](F64ArrayHdl x) { return AllCosWinH(x, 10, 0); }},
       {"AllCos selector 30", TSM_ERR_BAD_SELECTOR, [](F64ArrayHdl x) { return AllCosWinH(x, 30, 0); }},
       {"AllCos selector -1", TSM_ERR_BAD_SELECTOR, [](F64ArrayHdl x) { return AllCosWinH(x, -1, 1); }},
@@ -192,10 +188,7 @@ TEST_F(WindowEntries, SymmetricRectangleAndSingleSample) {
 // sum: cg = a0, enbw = (a0^2 + sum_{k>0} a_k^2 / 2) / a0^2. The table's
 // figures agree with those to 3e-6 (Blackman-Nuttall's is the farthest).
 TEST_F(WindowEntries, ConstantsTable) {
-  struct Row {
-    int sel;
-    double enbw, cg;
-  } rows[] = {
+  struct Row { int sel; double enbw, cg; } rows[] = {
       {0, 1, 1},
       {1, 1.5, 0.5},
       {2, 1.362826, 0.54},

@@ -145,22 +145,6 @@ std::vector<CxL> RandomSignal(std::size_t n, bool real, std::mt19937_64& rng) {
   return x;
 }
 
-// Bin q of a HalfComplex array of length n, and the slot that holds each part.
-CxL FromHalfComplex(const std::vector<long double>& h, std::size_t q) {
-  const std::size_t n = h.size();
-  if (q == 0 || 2 * q == n) return h[q];
-  return 2 * q < n ? CxL(h[q], h[n - q]) : CxL(h[n - q], -h[q]);
-}
-std::vector<long double> ToHalfComplex(const std::vector<CxL>& spectrum) {
-  const std::size_t n = spectrum.size();
-  std::vector<long double> h(n);
-  for (std::size_t q = 0; 2 * q <= n; ++q) {
-    h[q] = spectrum[q].real();
-    if (q != 0 && 2 * q != n) h[n - q] = spectrum[q].imag();
-  }
-  return h;
-}
-
 // Twiddle tables of a pass of radix r over blocks of m: row k (1 <= k < m),
 // entry j (1 <= j < r) at (k-1)(r-1) + j-1 holds exp(-2 pi i j k / (r m)),
 // the cosine and the negative sine, rounded from long double.

@@ -175,28 +175,22 @@ TEST_F(Entries, SpectraMatchLongDoubleDftsAndTwinsAgree) {
   }
 }
 
-TEST_F(Entries, SpectraCheckCountsInOrderAndEmptyTheOutput) {
-  for (const auto& [n, m] : {std::pair{0, 4}, std::pair{4, 0}, std::pair{0, 0}, std::pair{8, 9}, std::pair{9, 8}}) {
-    const Data d(n, m);
-    for (const Case& c : Cases())
-      for (bool twin : {false, true}) {
+// Counts checked in order, and refused resizes: each empties the output.
+TEST_F(Entries, SpectraFailuresEmptyTheOutput) {
+  const Data good(12, 12);
+  for (const Case& c : Cases())
+    for (bool twin : {false, true}) {
+      for (const auto& [n, m] : {std::pair{0, 4}, std::pair{4, 0}, std::pair{0, 0}, std::pair{8, 9}, std::pair{9, 8}}) {
         const int32_t want = n < 1 || (c.pair && m < 1) ? TSM_ERR_EMPTY : c.pair && n != m ? TSM_ERR_SIZE_MISMATCH : 0;
         if (want == 0) continue;
         States s;
-        Arrays a(d);
+        Arrays a(Data(n, m));
         EXPECT_EQ(c.call(a, s, twin), want) << c.name << " " << n << " " << m;
         EXPECT_TRUE(c.read(a).empty()) << c.name;
         EXPECT_TRUE(s.plain == nullptr && s.reserved == nullptr) << c.name;
       }
-  }
-}
-
-TEST_F(Entries, SpectraRefusedResizeGivesNoMemoryAndAnEmptyOutput) {
-  const Data d(12, 12);
-  for (const Case& c : Cases())
-    for (bool twin : {false, true}) {
       States s;
-      Arrays a(d);
+      Arrays a(good);
       const int made = RunFailingEachResize([&] { return c.call(a, s, twin); }, [&](int k, int32_t result) {
         EXPECT_EQ(result, TSM_ERR_NO_MEMORY) << c.name << " resize " << k;
         EXPECT_TRUE(c.read(a).empty()) << c.name << " resize " << k;
@@ -359,15 +353,17 @@ TEST_F(Entries, TwoDimensionsWithOneStateForBoth) {
   }
 }
 
-TEST_F(Entries, DctAndDstEmptyInputGivesEmptyAndAnEmptyOutput) {
+// An empty input, and refused resizes: each empties the output.
+TEST_F(Entries, DctAndDstFailuresEmptyTheOutput) {
+  const V x = RandomReal(12, 5);
   for (const Kind* set : {kForward, kInverse})
     for (int i = 0; i < 2; ++i) {
       const Kind& k = set[i];
       States s, sCols;
-      F64 none, out{1.0}, out2{1.0};
-      EXPECT_EQ(k.plain1(none.Handle(), out.Handle(), 4, &s.plain), TSM_ERR_EMPTY) << k.name;
+      F64 none, out1{1.0}, out2{1.0};
+      EXPECT_EQ(k.plain1(none.Handle(), out1.Handle(), 4, &s.plain), TSM_ERR_EMPTY) << k.name;
       EXPECT_EQ(k.twin1(none.Handle(), out2.Handle(), 4, &s.reserved), TSM_ERR_EMPTY) << k.name;
-      EXPECT_TRUE(out.Count() == 0 && out2.Count() == 0) << k.name;
+      EXPECT_TRUE(out1.Count() == 0 && out2.Count() == 0) << k.name;
       for (const auto& [rows, cols] : {std::pair{0, 3}, std::pair{3, 0}}) {
         HostMatrix in(rows, cols, {}), y(1, 1, {1.0}), y2(2, 1, {1.0, 2.0});
         EXPECT_EQ(k.plain2(in.Handle(), y.Handle(), 2, 2, &s.plain, &sCols.plain), TSM_ERR_EMPTY) << k.name;
@@ -375,15 +371,6 @@ TEST_F(Entries, DctAndDstEmptyInputGivesEmptyAndAnEmptyOutput) {
         for (const HostMatrix* m : {&y, &y2}) EXPECT_TRUE(m->Dim(0) == 0 && m->Dim(1) == 0) << k.name;
       }
       EXPECT_TRUE(s.plain == nullptr && sCols.plain == nullptr && s.reserved == nullptr) << k.name;
-    }
-}
-
-TEST_F(Entries, DctAndDstRefusedResizeGivesNoMemoryAndAnEmptyOutput) {
-  const V x = RandomReal(12, 5);
-  for (const Kind* set : {kForward, kInverse})
-    for (int i = 0; i < 2; ++i) {
-      const Kind& k = set[i];
-      States s, sCols;
       F64 in(x), out{1.0};
       HostMatrix min(3, 4, x), mout(1, 1, {1.0});
       const std::function<int32_t()> calls[] = {

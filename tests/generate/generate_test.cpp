@@ -315,13 +315,10 @@ TEST(GenerateChecks, RefusedResizes) {
       EXPECT_EQ(err, TSM_ERR_NO_MEMORY);
     }
   }
+  // Form B: a ramp and a pulse stand for the rest, which share their frame.
   for (const auto& call : std::vector<std::function<int32_t(F64ArrayHdl)>>{
            [](F64ArrayHdl h) { return RampPtrn85(h, 4, 1, 2, 0, 1); },
-           [](F64ArrayHdl h) { return RampPtrn80(h, 4, 1, 2, 1); },
-           [](F64ArrayHdl h) { return AperiodTriangleH(h, 4, 1, 0, 1, 1, 0.5); },
-           [](F64ArrayHdl h) { return GaussMonopulseH(h, 4, 1, 0, 1, 1); },
-           [](F64ArrayHdl h) { return GaussPulseH(h, 4, 1, 0, 1, 1, 1, 6); },
-           [](F64ArrayHdl h) { return PeriodicSincH(h, 4, 1, 3, 1, 0); }}) {
+           [](F64ArrayHdl h) { return GaussPulseH(h, 4, 1, 0, 1, 1, 1, 6); }}) {
     F64 out;
     const int made = RunFailingEachResize([&] { return call(out.Handle()); }, [&](int, int32_t ret) {
       EXPECT_EQ(ret, TSM_ERR_NO_MEMORY);

@@ -22,7 +22,6 @@ template <class Block>
 struct BlockType;
 template <> struct BlockType<F64Array> { using Elem = double; static constexpr int32_t kType = TSM_TYPE_F64; };
 template <> struct BlockType<I32Array> { using Elem = int32_t; static constexpr int32_t kType = TSM_TYPE_I32; };
-template <> struct BlockType<U8Array> { using Elem = uint8_t; static constexpr int32_t kType = TSM_TYPE_U8; };
 template <> struct BlockType<U32Array> { using Elem = uint32_t; static constexpr int32_t kType = TSM_TYPE_U32; };
 template <> struct BlockType<CxArray> { using Elem = cx; static constexpr int32_t kType = TSM_TYPE_CX128; };
 template <> struct BlockType<GenHistIntervalArray> {

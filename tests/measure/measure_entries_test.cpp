@@ -65,8 +65,11 @@ double LongSumSquares(const V& x, int from, int to) {
 
 // Each output within its own tolerance; NaN skips an output.
 void ExpectNear(const V& got, const V& want, const V& tol) {
-  for (size_t i = 0; i < want.size(); ++i)
-    if (!std::isnan(want[i])) EXPECT_NEAR(got[i], want[i], tol[i]) << "output " << i;
+  for (size_t i = 0; i < want.size(); ++i) {
+    if (!std::isnan(want[i])) {
+      EXPECT_NEAR(got[i], want[i], tol[i]) << "output " << i;
+    }
+  }
 }
 
 ReferenceLevels Percent(double lo = 10, double mid = 50, double hi = 90) { return {hi, mid, lo, 1}; }

@@ -104,11 +104,7 @@ TEST_F(ChirpZ, UnitCircleGivesTheDftOfARealInput) {
 
 TEST_F(ChirpZ, ChecksInOrder) {
   const double nan = std::nan(""), inf = INFINITY;
-  struct Case {
-    int n;
-    cx A, W;
-    int32_t method, want;
-  } cases[] = {
+  struct Case { int n; cx A, W; int32_t method, want; } cases[] = {
       {0, {0, 0}, {nan, 0}, 7, TSM_ERR_EMPTY},
       {3, {0, 0}, {nan, 0}, 2, TSM_ERR_BAD_SELECTOR},
       {3, {1, 0}, {1, 0}, -1, TSM_ERR_BAD_SELECTOR},
@@ -134,10 +130,7 @@ TEST_F(ChirpZ, ChecksInOrder) {
 }
 
 TEST_F(ChirpZ, InverseRecoversTheSamples) {
-  struct Case {
-    int M, n;
-    cx A, W;
-  } cases[] = {
+  struct Case { int M, n; cx A, W; } cases[] = {
       {16, 16, {1, 0}, {std::cos(2 * M_PI / 16), -std::sin(2 * M_PI / 16)}},
       {12, 12, {1.05 * std::cos(0.3), 1.05 * std::sin(0.3)}, {0.98 * std::cos(0.5), -0.98 * std::sin(0.5)}},
       {5, 9, {0.9, 0.1}, {std::cos(1.1), std::sin(1.1)}},
@@ -157,11 +150,7 @@ TEST_F(ChirpZ, InverseRecoversTheSamples) {
   }
   // Checks: empty, more outputs than inputs, the spiral, coinciding points.
   const double nan = std::nan("");
-  struct Bad {
-    int n, M;
-    cx A, W;
-    int32_t want;
-  } bad[] = {{0, 0, {1, 0}, {0, 1}, TSM_ERR_EMPTY},
+  struct Bad { int n, M; cx A, W; int32_t want; } bad[] = {{0, 0, {1, 0}, {0, 1}, TSM_ERR_EMPTY},
              {3, 4, {1, 0}, {0, 1}, TSM_ERR_SIZE_PAIR},
              {3, 2, {1, 0}, {nan, 1}, TSM_ERR_NON_FINITE},
              {3, 2, {0, 0}, {0, 1}, TSM_ERR_NOTHING_TO_FIT},

@@ -118,10 +118,7 @@ TEST_F(Fft2D, InversesUndoTheShiftInBothDimensions) {
 }
 
 TEST_F(Fft2D, ChecksInOrderEmptyTheOutput) {
-  struct Case {
-    int inR, inC, ro, co, rows, cols;
-    int32_t want;
-  } cases[] = {
+  struct Case { int inR, inC, ro, co, rows, cols; int32_t want; } cases[] = {
       {0, 3, 5, 5, 0, 0, TSM_ERR_EMPTY},       {3, 3, 3, 0, 0, 2, TSM_ERR_INDEX_RANGE},
       {3, 3, 0, 3, 2, 2, TSM_ERR_INDEX_RANGE}, {3, 3, 0, 0, 0, 2, TSM_ERR_SIZE_PAIR},
       {3, 3, 0, 0, 2, -1, TSM_ERR_SIZE_PAIR},  {3, 3, -1, 0, 2, 2, TSM_ERR_INDEX_RANGE},

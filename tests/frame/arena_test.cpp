@@ -17,9 +17,7 @@ constexpr std::uintptr_t kHeader = 2 * sizeof(void*);
 TEST_F(ArenaTest, BlocksAreLaidOutBackToBack) {
   MakeArena(4096);
   // A request takes its size rounded up to the word, a two-word header and 8 spare bytes.
-  struct Case {
-    std::uintptr_t n, span;
-  } cases[] = {{0, 24}, {1, 32}, {8, 32}, {9, 40}, {100, 128}};
+  struct Case { std::uintptr_t n, span; } cases[] = {{0, 24}, {1, 32}, {8, 32}, {9, 40}, {100, 128}};
   std::uintptr_t at = 0;
   std::vector<void*> blocks;
   for (const Case& c : cases) {

@@ -36,34 +36,21 @@ const Value kValues[] = {
     {-1.7976931348622e308, 0},
 };
 
-// The value at the end of a misaligned run of harmless data.
-template <class Fn>
-int ScanMisaligned(Fn scan, const std::vector<double>& data) {
-  std::vector<unsigned char> raw(4 + data.size() * sizeof(double));
-  std::memcpy(raw.data() + 4, data.data(), data.size() * sizeof(double));
-  return scan(raw.data() + 4, static_cast<int>(data.size()));
-}
-
-TEST(Validity, RealScanBounds) {
+// Each value at the end of a misaligned run of harmless data, and in either
+// part of the last element of a complex run.
+TEST(Validity, ScansRefuseTheValuesOutOfBounds) {
+  std::vector<unsigned char> raw(4 + 8 * sizeof(double));
+  const auto put = [&](int i, double v) { std::memcpy(raw.data() + 4 + i * sizeof(double), &v, sizeof v); };
+  const auto* re = reinterpret_cast<const double*>(raw.data() + 4);
+  const auto* z = reinterpret_cast<const tsm::cx*>(raw.data() + 4);
   for (const Value& c : kValues) {
-    std::vector<double> data(7, 1.5);
-    data.back() = c.v;
-    const int got = ScanMisaligned(
-        [](unsigned char* p, int n) { return tsm::HasNonFiniteValue(reinterpret_cast<double*>(p), n); }, data);
-    EXPECT_EQ(got, c.refused) << c.v;
-  }
-}
-
-TEST(Validity, ComplexScanLooksAtBothParts) {
-  for (const Value& c : kValues) {
-    for (int part = 0; part < 2; ++part) {
-      std::vector<double> data(8, -2.5);
-      data[6 + part] = c.v;  // the last element's real or imaginary part
-      const int got = ScanMisaligned(
-          [](unsigned char* p, int n) { return tsm::CxHasNonFiniteValue(reinterpret_cast<tsm::cx*>(p), n / 2); },
-          data);
-      EXPECT_EQ(got, c.refused) << c.v << " part " << part;
-    }
+    for (int i = 0; i < 8; ++i) put(i, 1.5);
+    put(6, c.v);
+    EXPECT_EQ(tsm::HasNonFiniteValue(re, 7), c.refused) << c.v;
+    EXPECT_EQ(tsm::CxHasNonFiniteValue(z, 4), c.refused) << c.v << " real part";
+    put(6, 1.5);
+    put(7, c.v);
+    EXPECT_EQ(tsm::CxHasNonFiniteValue(z, 4), c.refused) << c.v << " imaginary part";
   }
 }
 

@@ -32,10 +32,7 @@ class WorkspaceEntries : public ::testing::Test {
 };
 
 TEST_F(WorkspaceEntries, StateMovesAndCodes) {
-  struct Step {
-    Op op;
-    int32_t code;
-  };
+  struct Step { Op op; int32_t code; };
   // One walk through every legal and illegal move, from no arena.
   const Step walk[] = {
       {kInit0, 0},                           // no arena: a successful nothing

@@ -321,14 +321,9 @@ TEST(Noise, PeriodNoiseIsTheInverseTransformOfItsSpectrum) {
   }
   const V heap = Samples("period", 64, 1, 3);
   for (uint32_t size : {1u << 16, 100u}) {
-    ErrorCluster cl{0, 0};
-    InitializeAnalysisWorkspaceH(size, &cl);
-    EnableAnalysisWorkspaceH(&cl);
+    ScopedWorkspace ws(size);
     Rec r;
     const Res arena = Noise("period", 64, 1, 3, r);
-    DisableAnalysisWorkspaceH(&cl);
-    UninitializeAnalysisWorkspaceH(&cl);
-    EXPECT_EQ(cl.status, 0);
     EXPECT_EQ(arena.code, size == 100u ? -20001 : 0);
     EXPECT_EQ(arena.y, size == 100u ? V{} : heap);
   }

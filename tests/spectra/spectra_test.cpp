@@ -14,6 +14,9 @@
 
 #include "entries/fft_state.h"
 #include "support/host_arrays.h"
+#include "support/host_fixture.h"
+#include "support/host_matrix.h"
+#include "support/random_data.h"
 #include "support/reference_dft.h"
 
 namespace tsmtest {
@@ -37,19 +40,6 @@ double ScaledError(const Out& got, const Out& want) {
   return static_cast<double>(err / (scale > 0 ? scale : 1));
 }
 
-V RandomReal(int n, unsigned seed) {
-  std::mt19937 rng(seed);
-  std::uniform_real_distribution<double> u(-1, 1);
-  V v(std::max(n, 0));
-  for (double& x : v) x = u(rng);
-  return v;
-}
-std::vector<cx> RandomCx(int n, unsigned seed) {
-  const V re = RandomReal(n, seed), im = RandomReal(n, seed + 1000);
-  std::vector<cx> v;
-  for (size_t i = 0; i < re.size(); ++i) v.push_back(cx{re[i], im[i]});
-  return v;
-}
 Out AsOut(const V& v) { return Out(v.begin(), v.end()); }
 Out AsOut(const std::vector<cx>& v) {
   Out o;
@@ -65,15 +55,7 @@ struct States {
   ~States() { TransformUnreserveProc(&reserved); }
 };
 
-class Entries : public ::testing::Test {
- protected:
-  void SetUp() override { blocks_ = tsrt_live_blocks(); }
-  void TearDown() override {
-    tsrt_end_run();
-    EXPECT_EQ(tsrt_live_blocks(), blocks_);
-  }
-  int64_t blocks_ = 0;
-};
+using Entries = HostRunTest;
 
 // ---- Spectra, Hilbert and Hartley ------------------------------------------
 
@@ -193,28 +175,22 @@ TEST_F(Entries, SpectraMatchLongDoubleDftsAndTwinsAgree) {
   }
 }
 
-TEST_F(Entries, SpectraCheckCountsInOrderAndEmptyTheOutput) {
-  for (const auto& [n, m] : {std::pair{0, 4}, std::pair{4, 0}, std::pair{0, 0}, std::pair{8, 9}, std::pair{9, 8}}) {
-    const Data d(n, m);
-    for (const Case& c : Cases())
-      for (bool twin : {false, true}) {
+// Counts checked in order, and refused resizes: each empties the output.
+TEST_F(Entries, SpectraFailuresEmptyTheOutput) {
+  const Data good(12, 12);
+  for (const Case& c : Cases())
+    for (bool twin : {false, true}) {
+      for (const auto& [n, m] : {std::pair{0, 4}, std::pair{4, 0}, std::pair{0, 0}, std::pair{8, 9}, std::pair{9, 8}}) {
         const int32_t want = n < 1 || (c.pair && m < 1) ? TSM_ERR_EMPTY : c.pair && n != m ? TSM_ERR_SIZE_MISMATCH : 0;
         if (want == 0) continue;
         States s;
-        Arrays a(d);
+        Arrays a(Data(n, m));
         EXPECT_EQ(c.call(a, s, twin), want) << c.name << " " << n << " " << m;
         EXPECT_TRUE(c.read(a).empty()) << c.name;
         EXPECT_TRUE(s.plain == nullptr && s.reserved == nullptr) << c.name;
       }
-  }
-}
-
-TEST_F(Entries, SpectraRefusedResizeGivesNoMemoryAndAnEmptyOutput) {
-  const Data d(12, 12);
-  for (const Case& c : Cases())
-    for (bool twin : {false, true}) {
       States s;
-      Arrays a(d);
+      Arrays a(good);
       const int made = RunFailingEachResize([&] { return c.call(a, s, twin); }, [&](int k, int32_t result) {
         EXPECT_EQ(result, TSM_ERR_NO_MEMORY) << c.name << " resize " << k;
         EXPECT_TRUE(c.read(a).empty()) << c.name << " resize " << k;
@@ -225,9 +201,7 @@ TEST_F(Entries, SpectraRefusedResizeGivesNoMemoryAndAnEmptyOutput) {
 }
 
 TEST_F(Entries, ScratchComesFromTheHeapNotTheWorkspace) {
-  ErrorCluster e{0, 0};
-  InitializeAnalysisWorkspaceH(64, &e);
-  EnableAnalysisWorkspaceH(&e);
+  ScopedWorkspace ws(64);
   const Data d(15, 15);  // plans of 15, 30 and 32 points take no scratch of their own
   for (const Case& c : Cases()) {
     States s;
@@ -238,9 +212,6 @@ TEST_F(Entries, ScratchComesFromTheHeapNotTheWorkspace) {
   PlanHolder* state = nullptr;
   EXPECT_EQ(DCT_1DH(x.Handle(), y.Handle(), 0, &state), 0);
   EXPECT_EQ(DST_1DH(x.Handle(), y.Handle(), 0, &state), 0);
-  DisableAnalysisWorkspaceH(&e);
-  UninitializeAnalysisWorkspaceH(&e);
-  EXPECT_EQ(e.status, 0);
 }
 
 // ---- DCT and DST -------------------------------------------------------------
@@ -283,28 +254,7 @@ V Samples(int count, long long a, long long b, long long c) {
   return x;
 }
 
-class HostMatrix {
- public:
-  HostMatrix(int rows, int cols, const V& v)
-      : h_(static_cast<MatrixHdl>(tsrt_new_matrix(TSM_TYPE_F64, rows, cols, v.empty() ? nullptr : v.data()))) {}
-  HostMatrix(const HostMatrix&) = delete;
-  HostMatrix& operator=(const HostMatrix&) = delete;
-  ~HostMatrix() { tsrt_dispose(h_); }
-  MatrixHdl Handle() const { return h_; }
-  int Dim(int d) const {
-    int32_t v;
-    std::memcpy(&v, reinterpret_cast<const char*>(*h_) + 4 * d, 4);
-    return v;
-  }
-  V Values() const {
-    V v(static_cast<size_t>(std::max(Dim(0) * Dim(1), 0)));
-    if (!v.empty()) std::memcpy(v.data(), reinterpret_cast<const char*>(*h_) + 8, v.size() * sizeof(double));
-    return v;
-  }
-
- private:
-  MatrixHdl h_;
-};
+using HostMatrix = Mat;
 
 // The entries of a kind; the inverses, which have no sizes, are called
 // through forms that take and drop them.
@@ -403,15 +353,17 @@ TEST_F(Entries, TwoDimensionsWithOneStateForBoth) {
   }
 }
 
-TEST_F(Entries, DctAndDstEmptyInputGivesEmptyAndAnEmptyOutput) {
+// An empty input, and refused resizes: each empties the output.
+TEST_F(Entries, DctAndDstFailuresEmptyTheOutput) {
+  const V x = RandomReal(12, 5);
   for (const Kind* set : {kForward, kInverse})
     for (int i = 0; i < 2; ++i) {
       const Kind& k = set[i];
       States s, sCols;
-      F64 none, out{1.0}, out2{1.0};
-      EXPECT_EQ(k.plain1(none.Handle(), out.Handle(), 4, &s.plain), TSM_ERR_EMPTY) << k.name;
+      F64 none, out1{1.0}, out2{1.0};
+      EXPECT_EQ(k.plain1(none.Handle(), out1.Handle(), 4, &s.plain), TSM_ERR_EMPTY) << k.name;
       EXPECT_EQ(k.twin1(none.Handle(), out2.Handle(), 4, &s.reserved), TSM_ERR_EMPTY) << k.name;
-      EXPECT_TRUE(out.Count() == 0 && out2.Count() == 0) << k.name;
+      EXPECT_TRUE(out1.Count() == 0 && out2.Count() == 0) << k.name;
       for (const auto& [rows, cols] : {std::pair{0, 3}, std::pair{3, 0}}) {
         HostMatrix in(rows, cols, {}), y(1, 1, {1.0}), y2(2, 1, {1.0, 2.0});
         EXPECT_EQ(k.plain2(in.Handle(), y.Handle(), 2, 2, &s.plain, &sCols.plain), TSM_ERR_EMPTY) << k.name;
@@ -419,15 +371,6 @@ TEST_F(Entries, DctAndDstEmptyInputGivesEmptyAndAnEmptyOutput) {
         for (const HostMatrix* m : {&y, &y2}) EXPECT_TRUE(m->Dim(0) == 0 && m->Dim(1) == 0) << k.name;
       }
       EXPECT_TRUE(s.plain == nullptr && sCols.plain == nullptr && s.reserved == nullptr) << k.name;
-    }
-}
-
-TEST_F(Entries, DctAndDstRefusedResizeGivesNoMemoryAndAnEmptyOutput) {
-  const V x = RandomReal(12, 5);
-  for (const Kind* set : {kForward, kInverse})
-    for (int i = 0; i < 2; ++i) {
-      const Kind& k = set[i];
-      States s, sCols;
       F64 in(x), out{1.0};
       HostMatrix min(3, 4, x), mout(1, 1, {1.0});
       const std::function<int32_t()> calls[] = {

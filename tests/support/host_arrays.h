@@ -22,7 +22,6 @@ template <class Block>
 struct BlockType;
 template <> struct BlockType<F64Array> { using Elem = double; static constexpr int32_t kType = TSM_TYPE_F64; };
 template <> struct BlockType<I32Array> { using Elem = int32_t; static constexpr int32_t kType = TSM_TYPE_I32; };
-template <> struct BlockType<U8Array> { using Elem = uint8_t; static constexpr int32_t kType = TSM_TYPE_U8; };
 template <> struct BlockType<U32Array> { using Elem = uint32_t; static constexpr int32_t kType = TSM_TYPE_U32; };
 template <> struct BlockType<CxArray> { using Elem = cx; static constexpr int32_t kType = TSM_TYPE_CX128; };
 template <> struct BlockType<GenHistIntervalArray> {
@@ -123,5 +122,28 @@ inline Scalar CallScalar(const std::function<int32_t(double*, int32_t*)>& call) 
   r.ret = call(&r.value, &r.err);
   return r;
 }
+
+// An analysis workspace of `bytes`, enabled for the scope. Removing it fails
+// while a scratch block is still out, so a leak shows here.
+class ScopedWorkspace {
+ public:
+  explicit ScopedWorkspace(uint32_t bytes) {
+    InitializeAnalysisWorkspaceH(bytes, &e_);
+    EnableAnalysisWorkspaceH(&e_);
+    const int status = e_.status;
+    EXPECT_EQ(status, 0) << "workspace not made";
+  }
+  ~ScopedWorkspace() {
+    DisableAnalysisWorkspaceH(&e_);
+    UninitializeAnalysisWorkspaceH(&e_);
+    const int status = e_.status;
+    EXPECT_EQ(status, 0) << "scratch left live in the arena";
+  }
+  ScopedWorkspace(const ScopedWorkspace&) = delete;
+  ScopedWorkspace& operator=(const ScopedWorkspace&) = delete;
+
+ private:
+  ErrorCluster e_{0, 0};
+};
 
 }  // namespace tsmtest

@@ -73,6 +73,25 @@ inline std::vector<CxL> ReferenceDft(const std::vector<CxL>& x) {
   return y;
 }
 
+// HalfComplex layout of a real signal's spectrum: Re X[q] at q for
+// 0 <= q <= n/2, Im X[q] at n - q for 0 < q < n/2.
+inline std::vector<long double> ToHalfComplex(const std::vector<CxL>& spectrum) {
+  const size_t n = spectrum.size();
+  std::vector<long double> h(n);
+  for (size_t q = 0; 2 * q <= n; ++q) {
+    h[q] = spectrum[q].real();
+    if (q != 0 && 2 * q != n) h[n - q] = spectrum[q].imag();
+  }
+  return h;
+}
+// Bin q (any q < n) of a HalfComplex array.
+template <class T>
+CxL FromHalfComplex(const std::vector<T>& h, size_t q) {
+  const size_t n = h.size();
+  if (q == 0 || 2 * q == n) return h[q];
+  return 2 * q < n ? CxL(h[q], h[n - q]) : CxL(h[n - q], -h[q]);
+}
+
 // rms of (got - want) over the rms of want.
 template <class Got>
 double RelativeRms(const Got& got, const std::vector<CxL>& want) {

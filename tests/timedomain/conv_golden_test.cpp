@@ -34,22 +34,14 @@ struct Line {
   size_t at = 0;
   int Int() { return std::stoi(tok[at++]); }
   double Real() { return std::strtod(tok[at++].c_str(), nullptr); }
-  V Reals(long n) {
-    V v(n);
-    for (double& d : v) d = Real();
-    return v;
-  }
-  CV Cxs(long n) {
-    CV v(n);
-    for (cx& z : v) z = cx{Real(), Real()};
-    return v;
-  }
   template <class T>
   std::vector<T> Read(long n) {
-    if constexpr (std::is_same_v<T, double>)
-      return Reals(n);
-    else
-      return Cxs(n);
+    std::vector<T> v(n);
+    for (T& e : v) {
+      if constexpr (std::is_same_v<T, double>) e = Real();
+      else e = cx{Real(), Real()};
+    }
+    return v;
   }
 };
 

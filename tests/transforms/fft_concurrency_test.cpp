@@ -17,10 +17,7 @@ namespace {
 TEST(KwfftConcurrency, PlansSharedAcrossThreads) {
   // 107 -> 106 -> 53 -> 52, 59 -> 58 -> 29, 214 = 2 * 107, and plain lengths.
   const std::vector<int> lengths = {52, 53, 106, 107, 214, 59, 58, 64, 96, 23, 46, 1000, 1};
-  struct Case {
-    std::vector<double> re, im;
-    std::vector<CxL> exact;
-  };
+  struct Case { std::vector<double> re, im; std::vector<CxL> exact; };
   std::vector<Case> cases;
   std::mt19937 rng(3);
   std::uniform_real_distribution<double> u(-1, 1);

@@ -4,9 +4,9 @@
 
 #include <cmath>
 #include <cstring>
-#include <random>
 #include <vector>
 
+#include "support/random_data.h"
 #include "support/reference_dft.h"
 #include "transforms/kwfft.h"
 
@@ -68,26 +68,10 @@ struct Plan {
   ~Plan() { tsm::DestroyKwfftTable(p); }
 };
 
-std::vector<double> Uniform(int n, unsigned seed) {
-  std::mt19937_64 rng(seed);
-  std::uniform_real_distribution<double> u(-1.0, 1.0);
-  std::vector<double> v(static_cast<size_t>(n));
-  for (double& x : v) x = u(rng);
-  return v;
-}
-
 std::vector<CxL> ToCx(const std::vector<double>& re, const std::vector<double>& im) {
   std::vector<CxL> z(re.size());
   for (size_t i = 0; i < re.size(); ++i) z[i] = CxL(re[i], im.empty() ? 0.0 : im[i]);
   return z;
-}
-
-// Bin k of a HalfComplex array of length n.
-CxL FromHalfComplex(const std::vector<double>& h, size_t k) {
-  const size_t n = h.size();
-  if (k == 0) return h[0];
-  if (2 * k == n) return h[k];
-  return 2 * k < n ? CxL(h[k], h[n - k]) : CxL(h[n - k], -h[k]);
 }
 
 struct Errors {
@@ -100,7 +84,7 @@ Errors TransformErrors(int n) {
   Plan plan(n);
   EXPECT_NE(plan.p, nullptr) << n;
   if (plan.p == nullptr) return {1, 1, 1, 1};
-  const std::vector<double> xr = Uniform(n, 2 * n), xi = Uniform(n, 2 * n + 1);
+  const std::vector<double> xr = RandomReal(n, 2 * n), xi = RandomReal(n, 2 * n + 1);
   const std::vector<CxL> exact = ReferenceDft(ToCx(xr, xi));
   // The spectrum of the real part alone: (X[k] + conj X[n-k]) / 2.
   std::vector<CxL> exactReal(n);
@@ -123,12 +107,8 @@ Errors TransformErrors(int n) {
   EXPECT_EQ(tsm::kwfft_real(plan.p, xr.data(), h.data(), 1, 1, n), 0);
   e.realForward = RelativeRms([&](size_t k) { return FromHalfComplex(h, k); }, exactReal);
 
-  for (int k = 0; k < n; ++k) {  // the exact HalfComplex
-    if (k == 0 || 2 * k == n)
-      h[k] = static_cast<double>(exactReal[k].real());
-    else if (2 * k < n)
-      h[k] = static_cast<double>(exactReal[k].real()), h[n - k] = static_cast<double>(exactReal[k].imag());
-  }
+  const std::vector<long double> hc = ToHalfComplex(exactReal);
+  h.assign(hc.begin(), hc.end());
   EXPECT_EQ(tsm::kwfft_real_inverse(plan.p, h.data(), back.data(), 1, 1, n), 0);
   e.realInverse = RelativeRms([&](size_t k) { return CxL(back[k]); }, ToCx(xr, {}));
   return e;
@@ -145,10 +125,7 @@ void ExpectAccurate(int n) {
 }
 
 TEST(KwfftPlan, FactorListsAndKinds) {
-  struct Case {
-    int n;
-    std::vector<int> factors, kinds;
-  };
+  struct Case { int n; std::vector<int> factors, kinds; };
   const Case cases[] = {
       {60, {2, 3, 10}, {0, 0, 0}},          {1000, {10, 10, 10}, {0, 0, 0}},
       {64, {2, 32}, {0, 0}},                {1024, {32, 32}, {0, 0}},
@@ -245,7 +222,7 @@ TEST(KwfftTransform, LargeAndAwkwardLengths) {
 TEST(KwfftTransform, StridedAndInterleavedData) {
   for (int n : {1, 12, 53, 96, 230}) {
     Plan plan(n);
-    const std::vector<double> xr = Uniform(n, 7), xi = Uniform(n, 8);
+    const std::vector<double> xr = RandomReal(n, 7), xi = RandomReal(n, 8);
     const std::vector<CxL> exact = ReferenceDft(ToCx(xr, xi));
     // Interleaved input at a 4-byte offset, output every third element.
     std::vector<unsigned char> raw(4 + 16 * n);
@@ -275,7 +252,7 @@ TEST(KwfftTransform, ALengthMismatchWritesNothing) {
 TEST(KwfftHalfComplex, UnpackAndPackWithAndWithoutShift) {
   for (int n : {1, 2, 3, 4, 5, 8, 9, 10}) {
     Plan plan(n);
-    const std::vector<double> x = Uniform(n, 11);
+    const std::vector<double> x = RandomReal(n, 11);
     const std::vector<CxL> exact = ReferenceDft(ToCx(x, {}));
     for (int shift : {0, 1}) {
       std::vector<tsm::cx> spectrum(n, tsm::cx{7.0, 7.0});

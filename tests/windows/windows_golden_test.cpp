@@ -23,12 +23,13 @@
 #include <fstream>
 #include <functional>
 #include <map>
-#include <random>
+#include <optional>
 #include <sstream>
 #include <string>
 #include <vector>
 
 #include "support/host_arrays.h"
+#include "support/random_data.h"
 #include "windows/window_coefficients.h"
 
 namespace tsmtest {
@@ -145,14 +146,6 @@ std::function<int32_t(F64ArrayHdl)> OtherEntry(const Case& c) {
   return {};
 }
 
-std::vector<cx> Noise(int n, unsigned seed) {
-  std::mt19937 rng(seed);
-  std::uniform_real_distribution<double> u(-2, 2);
-  std::vector<cx> v(n);
-  for (cx& z : v) z = cx{u(rng), u(rng)};
-  return v;
-}
-
 std::string Name(const Case& c) {
   std::ostringstream s;
   s << c.kind << " sel " << c.sel << " param " << c.param << " n " << c.n;
@@ -176,7 +169,7 @@ void CheckWindows() {
     }
 
     // The complex twin scales both parts by exactly the real window.
-    const std::vector<cx> z = Noise(c.n, c.n);
+    const std::vector<cx> z = RandomCx(c.n, c.n);
     V re, im;
     for (const cx& v : z) re.push_back(v.re), im.push_back(v.im);
     Cx zc(z);
@@ -238,19 +231,10 @@ void CheckScaledCosineSums() {
 class WindowsGolden : public ::testing::TestWithParam<bool> {
  protected:
   void SetUp() override {
-    if (!GetParam()) return;
-    ErrorCluster e{0, 0};
-    InitializeAnalysisWorkspaceH(1 << 20, &e);
-    EnableAnalysisWorkspaceH(&e);
-    ASSERT_EQ(e.status, 0);
+    if (GetParam()) arena_.emplace(1 << 20);
   }
-  void TearDown() override {
-    if (!GetParam()) return;
-    ErrorCluster e{0, 0};
-    DisableAnalysisWorkspaceH(&e);
-    UninitializeAnalysisWorkspaceH(&e);
-    EXPECT_EQ(e.code, 0) << "scratch left live in the arena";
-  }
+  void TearDown() override { arena_.reset(); }
+  std::optional<ScopedWorkspace> arena_;
 };
 
 TEST_P(WindowsGolden, WindowsMatchReferences) { CheckWindows(); }

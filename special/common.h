@@ -37,20 +37,22 @@ f64 PolyEval(f64 x, const f64* coef, int32 n);
 f64 PolyEval1(f64 x, const f64* coef, int32 n);
 
 // Two pairs of convergents of a continued fraction, p_k = b p_(k-1) + a p_(k-2)
-// and likewise q_k, rescaled by 1/big when |p_k| exceeds big.
-struct Convergents {
-  f64 pkm2, pkm1, qkm2, qkm1;
-  f64 value;  // the last ratio p/q
+// and likewise q_k, rescaled by 1/big when |p_k| exceeds big. T is the
+// working precision (long double where many rounds accumulate rounding).
+template <typename T>
+struct ConvergentsOf {
+  T pkm2, pkm1, qkm2, qkm1;
+  T value;  // the last ratio p/q
 
   // Takes one more term; returns the relative change of the value, or 1 when
   // the new denominator is 0 (the value then stays).
-  f64 Step(f64 a, f64 b) {
-    const f64 pk = pkm1 * b + pkm2 * a;
-    const f64 qk = qkm1 * b + qkm2 * a;
+  f64 Step(T a, T b) {
+    const T pk = pkm1 * b + pkm2 * a;
+    const T qk = qkm1 * b + qkm2 * a;
     f64 change = 1.0;
     if (qk != 0) {
-      const f64 r = pk / qk;
-      change = std::fabs((value - r) / r);
+      const T r = pk / qk;
+      change = static_cast<f64>(std::fabs((value - r) / r));
       value = r;
     }
     pkm2 = pkm1;
@@ -66,6 +68,7 @@ struct Convergents {
     return change;
   }
 };
+using Convergents = ConvergentsOf<f64>;
 
 // The code every kernel passes to the hook.
 inline constexpr int32 kMathKernel = 1;

@@ -5,7 +5,8 @@ Runs the golden test binary (which prints, per kernel, the point count and our
 maximum and median error on the grids of tests/data/special_gamma_*.txt),
 evaluates scipy.special on the very same points with the same error measure
 (|value - reference| / scale, restricted to the same well-conditioned points),
-and writes docs/accuracy.md.
+and rewrites the "Gamma family" section of docs/accuracy.md (the sections of
+the other families stay).
 
 Needs Debian's python3 with python3-numpy and python3-scipy, from the repository root:
     /usr/bin/python3 tools/special/accuracy.py build/tests/special_gamma/test_special_gamma
@@ -86,8 +87,8 @@ def main():
     out = subprocess.run([sys.argv[1]], capture_output=True, text=True).stdout
     ours = {m.group(1): (int(m.group(2)), float(m.group(3)), float(m.group(4)))
             for m in re.finditer(r"^\[accuracy\] (\S+) (\d+) (\S+) (\S+)$", out, re.M)}
-    lines = ["# Accuracy of the special functions", "",
-             "Gamma family, against mpmath at 40 digits on the grids of tests/data/special_gamma_*.txt",
+    lines = ["## Gamma family", "",
+             "Against mpmath at 40 digits on the grids of tests/data/special_gamma_*.txt",
              "(tools/golden/special_gamma_golden.py), beside scipy.special %s on the same points with the" % scipy.__version__,
              "same measure: |value - reference| / scale, scale being |reference|, or the function's envelope",
              "where noted. For the beta and incomplete gamma and beta functions only the points whose",
@@ -100,8 +101,14 @@ def main():
         n, smax, smed = scipy_errors(spec)
         on, omax, omed = ours.get(spec[0], (0, float("nan"), float("nan")))
         lines.append("| %s | %s | %d | %.2g | %.2g | %.2g | %.2g |" % (spec[0], spec[8], on, omax, omed, smax, smed))
-    with open(os.path.join(ROOT, "docs", "accuracy.md"), "w") as fh:
-        fh.write("\n".join(lines) + "\n")
+    path = os.path.join(ROOT, "docs", "accuracy.md")
+    with open(path) as fh:
+        old = fh.read()
+    start = old.index("## Gamma family")
+    end = old.find("\n## ", start + 1)
+    rest = old[end + 1:] if end >= 0 else ""
+    with open(path, "w") as fh:
+        fh.write(old[:start] + "\n".join(lines) + "\n\n" + rest)
     print("\n".join(lines))
 
 

@@ -7,6 +7,8 @@
 #pragma once
 
 #include <cmath>
+#include <cstdint>
+#include <cstring>
 
 #include "frame/types.h"
 
@@ -23,18 +25,45 @@ enum MathErrorType : int32 { kMathDomain = 0, kMathSingularity = 1, kMathOverflo
 // Called by every domain, singularity and overflow path; does nothing.
 void MathErrorHook(int32 kind, int32 type);
 
+namespace detail {
+inline constexpr std::uint64_t kExponentMask = 0x7FF0000000000000ull;
+inline constexpr std::uint64_t kMantissaMask = 0x000FFFFFFFFFFFFFull;
+inline std::uint64_t Bits(f64 x) {
+  std::uint64_t b;
+  std::memcpy(&b, &x, sizeof b);
+  return b;
+}
+}  // namespace detail
+
+// The helpers below are inline: they sit in every kernel's hot path, and
+// with a constant degree the compiler unrolls the polynomials.
+
 // True for any NaN, signalling or quiet.
-bool IsNaNValue(f64 x);
+inline bool IsNaNValue(f64 x) {
+  const std::uint64_t b = detail::Bits(x);
+  return (b & detail::kExponentMask) == detail::kExponentMask && (b & detail::kMantissaMask) != 0;
+}
 // True unless the exponent field is all ones.
-bool IsFiniteValue(f64 x);
+inline bool IsFiniteValue(f64 x) { return (detail::Bits(x) & detail::kExponentMask) != detail::kExponentMask; }
 // 0 for a finite value or NaN, +1 for plus infinity, -1 for minus infinity.
-int32 InfinitySign(f64 x);
+inline int32 InfinitySign(f64 x) {
+  if (IsFiniteValue(x) || IsNaNValue(x)) return 0;
+  return x > 0 ? 1 : -1;
+}
 
 // coef[0] x^n + ... + coef[n] by Horner's rule (n + 1 coefficients).
-f64 PolyEval(f64 x, const f64* coef, int32 n);
+inline f64 PolyEval(f64 x, const f64* coef, int32 n) {
+  f64 y = coef[0];
+  for (int32 i = 1; i <= n; ++i) y = y * x + coef[i];
+  return y;
+}
 // The same with an implied leading coefficient 1 and n stored coefficients:
 // x^n + coef[0] x^(n-1) + ... + coef[n-1].
-f64 PolyEval1(f64 x, const f64* coef, int32 n);
+inline f64 PolyEval1(f64 x, const f64* coef, int32 n) {
+  f64 y = x + coef[0];
+  for (int32 i = 1; i < n; ++i) y = y * x + coef[i];
+  return y;
+}
 
 // Two pairs of convergents of a continued fraction, p_k = b p_(k-1) + a p_(k-2)
 // and likewise q_k, rescaled by 1/big when |p_k| exceeds big. T is the

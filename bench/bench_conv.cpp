@@ -7,31 +7,28 @@
 #include <benchmark/benchmark.h>
 #include <fftw3.h>
 
-#include <random>
+#include <algorithm>
 #include <vector>
 
+#include "fftw_timing.h"
 #include "frame/types.h"
 #include "timedomain/convolution.h"
 #include "transforms/fft2d.h"
-#include "transforms/kwfft_plan.h"
-
-#include "support/random_data.h"
+#include "transforms/plan_ref.h"
 
 namespace {
 
-// Reproducible data: the tests' uniform samples in [-1, 1).
-std::vector<double> Noise(size_t n, unsigned seed) { return tsmtest::RandomReal(static_cast<int>(n), seed); }
+using tsmbench::Noise;
 
 void Convolve(benchmark::State& state, int32_t algorithm) {
   const int n = static_cast<int>(state.range(0)), m = static_cast<int>(state.range(1));
   const std::vector<double> x = Noise(n, 1), y = Noise(m, 2);
   std::vector<double> out(n + m - 1);
-  kwfft_table* hold = tsm::CreateKwfftTable(tsm::kwfft_next_smooth_length(n + m - 1));  // as a node would
+  const tsm::PlanRef hold(tsm::kwfft_next_smooth_length(n + m - 1));  // as a node would
   for (auto _ : state) {
     tsm::Convolve(x.data(), n, y.data(), m, algorithm, out.data());
     benchmark::DoNotOptimize(out.data());
   }
-  tsm::DestroyKwfftTable(hold);
 }
 void BM_ConvolveDirect(benchmark::State& state) { Convolve(state, tsm::kConvolveDirect); }
 void BM_ConvolveFft(benchmark::State& state) { Convolve(state, tsm::kConvolveFft); }
@@ -51,16 +48,13 @@ void Shapes(benchmark::internal::Benchmark* b) {
 
 void BM_Fft2DReal(benchmark::State& state) {
   const int R = static_cast<int>(state.range(0)), C = static_cast<int>(state.range(1));
-  kwfft_table* pc = tsm::CreateKwfftTable(C);
-  kwfft_table* pr = tsm::CreateKwfftTable(R);
+  const tsm::PlanRef pc(C), pr(R);
   const std::vector<double> x = Noise(size_t(R) * C, 3);
   std::vector<tsm::cx> X(size_t(R) * C);
   for (auto _ : state) {
-    tsm::ReFft2D(pc, pr, x.data(), R, C, 0, 0, R, C, 0, X.data());
+    tsm::ReFft2D(pc.get(), pr.get(), x.data(), R, C, 0, 0, R, C, 0, X.data());
     benchmark::DoNotOptimize(X.data());
   }
-  tsm::DestroyKwfftTable(pc);
-  tsm::DestroyKwfftTable(pr);
 }
 
 void BM_Fftw2DReal(benchmark::State& state) {
@@ -70,28 +64,19 @@ void BM_Fftw2DReal(benchmark::State& state) {
   fftw_plan p = fftw_plan_dft_r2c_2d(R, C, x, X, FFTW_MEASURE);
   const std::vector<double> v = Noise(size_t(R) * C, 3);
   std::copy(v.begin(), v.end(), x);
-  for (auto _ : state) {
-    fftw_execute(p);
-    benchmark::DoNotOptimize(X);
-  }
-  fftw_destroy_plan(p);
-  fftw_free(x);
-  fftw_free(X);
+  tsmbench::TimeFftwPlan(state, p, {x, X});
 }
 
 void BM_Fft2DComplex(benchmark::State& state) {
   const int R = static_cast<int>(state.range(0)), C = static_cast<int>(state.range(1));
-  kwfft_table* pc = tsm::CreateKwfftTable(C);
-  kwfft_table* pr = tsm::CreateKwfftTable(R);
+  const tsm::PlanRef pc(C), pr(R);
   const std::vector<double> v = Noise(2 * size_t(R) * C, 4);
   std::vector<tsm::cx> x(size_t(R) * C), X(size_t(R) * C);
   for (size_t i = 0; i < x.size(); ++i) x[i] = tsm::cx{v[2 * i], v[2 * i + 1]};
   for (auto _ : state) {
-    tsm::CxFft2D(pc, pr, x.data(), R, C, 0, 0, R, C, 0, X.data());
+    tsm::CxFft2D(pc.get(), pr.get(), x.data(), R, C, 0, 0, R, C, 0, X.data());
     benchmark::DoNotOptimize(X.data());
   }
-  tsm::DestroyKwfftTable(pc);
-  tsm::DestroyKwfftTable(pr);
 }
 
 void BM_Fftw2DComplex(benchmark::State& state) {
@@ -101,13 +86,7 @@ void BM_Fftw2DComplex(benchmark::State& state) {
   fftw_plan p = fftw_plan_dft_2d(R, C, x, X, FFTW_FORWARD, FFTW_MEASURE);
   const std::vector<double> v = Noise(2 * size_t(R) * C, 4);
   for (size_t i = 0; i < size_t(R) * C; ++i) x[i][0] = v[2 * i], x[i][1] = v[2 * i + 1];
-  for (auto _ : state) {
-    fftw_execute(p);
-    benchmark::DoNotOptimize(X);
-  }
-  fftw_destroy_plan(p);
-  fftw_free(x);
-  fftw_free(X);
+  tsmbench::TimeFftwPlan(state, p, {x, X});
 }
 
 BENCHMARK(BM_Fft2DReal)->Apply(Shapes);

@@ -6,32 +6,27 @@
 #include <benchmark/benchmark.h>
 #include <fftw3.h>
 
-#include <random>
+#include <algorithm>
 #include <vector>
 
+#include "fftw_timing.h"
 #include "transforms/dct.h"
+#include "transforms/plan_ref.h"
 
 namespace {
 
 const std::vector<int64_t> kLengths = {64, 255, 1000, 1024, 4096, 9973, 65536};
 
-void Fill(double* x, int n) {
-  std::mt19937_64 rng(7);
-  std::uniform_real_distribution<double> u(-1, 1);
-  for (int i = 0; i < n; ++i) x[i] = u(rng);
-}
-
 void Ours(benchmark::State& state, tsm::TrigKind kind) {
   const int n = static_cast<int>(state.range(0));
-  kwfft_table* plan = tsm::CreateKwfftTable(static_cast<tsm::int32>(tsm::TrigPlanLength(kind, n)));
-  std::vector<double> x(n), y(n);
-  Fill(x.data(), n);
+  const tsm::PlanRef plan(static_cast<tsm::int32>(tsm::TrigPlanLength(kind, n)));
+  const std::vector<double> x = tsmbench::Noise(n, 7);
+  std::vector<double> y(n);
   for (auto _ : state) {
-    tsm::TrigTransform(kind, plan, x.data(), n, y.data(), n);
+    tsm::TrigTransform(kind, plan.get(), x.data(), n, y.data(), n);
     benchmark::DoNotOptimize(y.data());
     benchmark::ClobberMemory();
   }
-  tsm::DestroyKwfftTable(plan);
   state.SetItemsProcessed(state.iterations() * n);
 }
 
@@ -40,15 +35,9 @@ void Fftw(benchmark::State& state, fftw_r2r_kind kind) {
   double* x = fftw_alloc_real(n);
   double* y = fftw_alloc_real(n);
   fftw_plan p = fftw_plan_r2r_1d(n, x, y, kind, FFTW_MEASURE);
-  Fill(x, n);
-  for (auto _ : state) {
-    fftw_execute(p);
-    benchmark::DoNotOptimize(y);
-    benchmark::ClobberMemory();
-  }
-  fftw_destroy_plan(p);
-  fftw_free(x);
-  fftw_free(y);
+  const std::vector<double> a = tsmbench::Noise(n, 7);
+  std::copy(a.begin(), a.end(), x);
+  tsmbench::TimeFftwPlan(state, p, {x, y});
   state.SetItemsProcessed(state.iterations() * n);
 }
 

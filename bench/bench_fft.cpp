@@ -5,19 +5,18 @@
 #include <benchmark/benchmark.h>
 #include <fftw3.h>
 
-#include <random>
+#include <algorithm>
 #include <vector>
 
+#include "fftw_timing.h"
 #include "transforms/kwfft.h"
-
-#include "support/random_data.h"
+#include "transforms/plan_ref.h"
 
 namespace {
 
-const std::vector<int64_t> kLengths = {64, 256, 1000, 1024, 4096, 44100, 48000, 65536, 1 << 20, 1009, 4099, 10007};
+using tsmbench::Noise;
 
-// Reproducible data: the tests' uniform samples in [-1, 1).
-std::vector<double> Noise(size_t n, unsigned seed) { return tsmtest::RandomReal(static_cast<int>(n), seed); }
+const std::vector<int64_t> kLengths = {64, 256, 1000, 1024, 4096, 44100, 48000, 65536, 1 << 20, 1009, 4099, 10007};
 
 void SetItems(benchmark::State& state, int n) {
   state.SetItemsProcessed(state.iterations() * n);
@@ -26,14 +25,13 @@ void SetItems(benchmark::State& state, int n) {
 
 void BM_KwfftComplex(benchmark::State& state) {
   const int n = static_cast<int>(state.range(0));
-  kwfft_table* plan = tsm::CreateKwfftTable(n);
+  const tsm::PlanRef plan(n);
   std::vector<double> xr = Noise(n, 1), xi = Noise(n, 2), yr(n), yi(n);
   for (auto _ : state) {
-    tsm::kwfft_complex(plan, xr.data(), xi.data(), yr.data(), yi.data(), 1, 1, n);
+    tsm::kwfft_complex(plan.get(), xr.data(), xi.data(), yr.data(), yi.data(), 1, 1, n);
     benchmark::DoNotOptimize(yr.data());
     benchmark::ClobberMemory();
   }
-  tsm::DestroyKwfftTable(plan);
   SetItems(state, n);
 }
 
@@ -48,26 +46,19 @@ void BM_FftwComplex(benchmark::State& state) {
   const std::vector<double> a = Noise(n, 1), b = Noise(n, 2);
   std::copy(a.begin(), a.end(), xr);
   std::copy(b.begin(), b.end(), xi);
-  for (auto _ : state) {
-    fftw_execute(p);
-    benchmark::DoNotOptimize(yr);
-    benchmark::ClobberMemory();
-  }
-  fftw_destroy_plan(p);
-  for (double* q : {xr, xi, yr, yi}) fftw_free(q);
+  tsmbench::TimeFftwPlan(state, p, {xr, xi, yr, yi});
   SetItems(state, n);
 }
 
 void BM_KwfftReal(benchmark::State& state) {
   const int n = static_cast<int>(state.range(0));
-  kwfft_table* plan = tsm::CreateKwfftTable(n);
+  const tsm::PlanRef plan(n);
   std::vector<double> x = Noise(n, 3), y(n);
   for (auto _ : state) {
-    tsm::kwfft_real(plan, x.data(), y.data(), 1, 1, n);
+    tsm::kwfft_real(plan.get(), x.data(), y.data(), 1, 1, n);
     benchmark::DoNotOptimize(y.data());
     benchmark::ClobberMemory();
   }
-  tsm::DestroyKwfftTable(plan);
   SetItems(state, n);
 }
 
@@ -78,14 +69,7 @@ void BM_FftwReal(benchmark::State& state) {
   fftw_plan p = fftw_plan_dft_r2c_1d(n, x, y, FFTW_MEASURE);
   const std::vector<double> a = Noise(n, 3);
   std::copy(a.begin(), a.end(), x);
-  for (auto _ : state) {
-    fftw_execute(p);
-    benchmark::DoNotOptimize(y);
-    benchmark::ClobberMemory();
-  }
-  fftw_destroy_plan(p);
-  fftw_free(x);
-  fftw_free(y);
+  tsmbench::TimeFftwPlan(state, p, {x, y});
   SetItems(state, n);
 }
 

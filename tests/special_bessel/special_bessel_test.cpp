@@ -30,12 +30,7 @@ using Row = tsmtest::GoldenRow;
 
 std::vector<Row> Load(const std::string& name) { return tsmtest::LoadGoldenRows("special_bessel_" + name + ".txt"); }
 
-// Relative to max(|want|, envelope); results in the subnormal range count
-// their rounding there as one eps.
-double Err(double got, double want, double envelope) {
-  const double s = std::fmax(std::fmax(std::fabs(want), envelope), std::numeric_limits<double>::min() / kEps);
-  return s == 0 ? std::fabs(got) : std::fabs(got - want) / s;
-}
+using tsmtest::EnvelopeError;
 
 // One golden file: `check` returns the error of one row in units of its own
 // allowance; all must stay at or below 1.
@@ -69,8 +64,8 @@ double AiryError(const Row& r) {
     ma = r[3] / std::sqrt(3.0);
     na = r[4] / std::sqrt(3.0);
   }
-  const double e = std::fmax(std::fmax(Err(v[0], r[1], ma), Err(v[2], r[3], m)),
-                             std::fmax(Err(v[1], r[2], na), Err(v[3], r[4], n)));
+  const double e = std::fmax(std::fmax(EnvelopeError(v[0], r[1], ma), EnvelopeError(v[2], r[3], m)),
+                             std::fmax(EnvelopeError(v[1], r[2], na), EnvelopeError(v[3], r[4], n)));
   const double zeta = 2.0 / 3 * std::pow(std::fabs(x), 1.5);
   return e / ((16 + 2 * zeta) * kEps);
 }
@@ -84,12 +79,12 @@ double KelvinError(const Row& r) {
   double a, b;
   TS_KelvinI(x, n, &a, &b);
   const double m = std::fmax(std::hypot(r[2], r[3]), in);
-  double e = std::fmax(Err(a, r[2], m), Err(b, r[3], m));
+  double e = std::fmax(EnvelopeError(a, r[2], m), EnvelopeError(b, r[3], m));
   if (x > 0) {
     TS_KelvinK(x, n, &a, &b);
     const double k = std::fmax(std::hypot(r[4], r[5]),
                                (2 + std::fabs(std::log(x / 2)) + std::log(std::abs(n) + x + 2)) * in);
-    e = std::fmax(e, std::fmax(Err(a, r[4], k), Err(b, r[5], k)));
+    e = std::fmax(e, std::fmax(EnvelopeError(a, r[4], k), EnvelopeError(b, r[5], k)));
   }
   return e / (16 * kEps);
 }
@@ -100,7 +95,7 @@ double KnError(const Row& r) {
   const int32_t n = static_cast<int32_t>(r[0]);
   double v;
   TS_BesselKn(n, r[1], &v);
-  return Err(v, r[2], 0) / ((16 + std::abs(n)) * kEps);
+  return EnvelopeError(v, r[2], 0) / ((16 + std::abs(n)) * kEps);
 }
 
 // 16 eps of the envelope the golden file carries: the modulus of J_v and Y_v
@@ -108,7 +103,7 @@ double KnError(const Row& r) {
 double StruveError(const Row& r) {
   double h;
   TS_Struve(r[1], r[0], &h);
-  return Err(h, r[2], r[3]) / (16 * kEps);
+  return EnvelopeError(h, r[2], r[3]) / (16 * kEps);
 }
 
 INSTANTIATE_TEST_SUITE_P(Kernels, Golden,

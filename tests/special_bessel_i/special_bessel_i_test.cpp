@@ -51,7 +51,7 @@ TEST_P(Golden, MatchesMpmath) {
   const auto rows = tsmtest::LoadGoldenRows(file);
   const double worst = tsmtest::WorstGoldenError(file, rows, 1.0, [&](const tsmtest::GoldenRow& r) {
     const double got = c.f(r[0], r[1]);
-    return std::fabs(got - r[2]) / std::fmax(std::fabs(r[2]), r[3]) / (24 * kEps);
+    return tsmtest::EnvelopeError(got, r[2], r[3]) / (24 * kEps);
   });
   std::printf("%-6s %zu cases, worst error %.2f of its allowance\n", c.file, rows.size(), worst);
 }

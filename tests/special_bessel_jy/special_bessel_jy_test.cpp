@@ -39,11 +39,7 @@ constexpr auto Js = Eval<TS_BesselJs, int32_t>;
 constexpr auto Ys = Eval<TS_BesselYs, int32_t>;
 
 // Error in units of kTol; an infinite reference wants exactly that infinity.
-double Err(double got, double want, double scale) {
-  if (std::isinf(want)) return got == want ? 0 : kInf;
-  const double s = std::fmax(std::fmax(std::fabs(want), scale), std::numeric_limits<double>::min() / kEps);
-  return std::fabs(got - want) / s / kTol;
-}
+double Err(double got, double want, double scale) { return tsmtest::EnvelopeError(got, want, scale) / kTol; }
 
 // Rows: order, x, first kind, second kind, their two scales; no second kind
 // for x < 0 (scale 0).

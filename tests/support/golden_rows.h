@@ -47,6 +47,16 @@ inline double WorstGoldenError(const std::string& file, const std::vector<Golden
   return worst;
 }
 
+// |got - want| relative to max(|want|, envelope), the envelope standing for
+// the size of an oscillating function near its zeros; a result in the
+// subnormal range counts its rounding there as one eps, and an infinite
+// want must be met exactly.
+inline double EnvelopeError(double got, double want, double envelope) {
+  if (std::isinf(want)) return got == want ? 0 : INFINITY;
+  constexpr double kEps = 2.220446049250313e-16, kTinyScale = 2.2250738585072014e-308 / kEps;
+  return std::fabs(got - want) / std::fmax(std::fmax(std::fabs(want), envelope), kTinyScale);
+}
+
 // Exact values and limits: {got, want}; NaN wants NaN.
 inline void ExpectCases(const std::vector<std::pair<double, double>>& cases) {
   for (size_t i = 0; i < cases.size(); ++i) {

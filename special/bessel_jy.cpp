@@ -113,7 +113,7 @@ void JYNonNegative(f64 nu, f64 x, f64* j, f64* y) {
       return;
     }
     if (x < SeriesLimit(nu)) {
-      *j = BesselJSeries(nu, x);
+      *j = BesselPowerSeries(nu, x, -1);
       return;
     }
   }
@@ -218,7 +218,7 @@ f64 SphericalBesselJ(int32 n, f64 x) {
   if (InfinitySign(x) > 0) return 0;
   const f64 v = n + 0.5;
   // In long double the factor cannot push a small result out of range.
-  if (x < SeriesLimit(v)) return BesselJSeries(v, x, std::sqrt(static_cast<long double>(kHalfPi) / x));
+  if (x < SeriesLimit(v)) return BesselPowerSeries(v, x, -1, std::sqrt(static_cast<long double>(kHalfPi) / x));
   return std::sqrt(kHalfPi / x) * BesselJ(v, x);
 }
 

@@ -120,11 +120,11 @@ long double SeriesPrefactor(f64 v, f64 x) {
   return sign * std::exp(lp - lg);
 }
 
-f64 BesselJSeries(f64 v, f64 x, long double factor) {
-  const long double y = -static_cast<long double>(x) * x / 4;
+f64 BesselPowerSeries(f64 v, f64 x, int sign, long double factor) {
+  const long double y = sign * static_cast<long double>(x) * x / 4;
   long double term = 1, sum = 1;
   for (int k = 1; k < kMaxTerms; ++k) {
-    term *= y / (k * (v + k));
+    term *= y / (k * (v + static_cast<long double>(k)));
     sum += term;
     // for negative orders the terms may still grow while v + k < 0
     if (v + k > 0 && std::fabs(term) <= kEpsLong * std::fabs(sum)) break;

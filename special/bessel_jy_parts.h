@@ -5,20 +5,12 @@
 #include <cstdint>
 
 #include "frame/types.h"
+#include "special/bessel_series.h"
 
 namespace tsm {
 
-// sin(pi r) and cos(pi r), exact at the multiples of 1/2.
-void SinCosPi(f64 r, f64* s, f64* c);
-
 // Orders 0 and 1 from their Chebyshev sets.
 void BesselJY01(int32 n, f64 x, f64* j, f64* y);
-
-// (x/2)^v / Gamma(v + 1) for any real v that is not a negative integer.
-long double SeriesPrefactor(f64 v, f64 x);
-
-// factor times the power series of J_v, summed in long double.
-f64 BesselJSeries(f64 v, f64 x, long double factor = 1);
 
 // The recurrence C_(m+1) = (2m/x) C_m - C_(m-1) upward, `steps` times from
 // a = C_(m-1), b = C_m, in long double; stops at an infinity.

@@ -166,13 +166,12 @@ f64 BesselJ(f64 v, f64 x) {
   }
   if (integer && v <= 1) {
     f64 j;
-    BesselJY01(static_cast<int32>(v), x, &j, nullptr);
+    BesselJY01(x, v == 0 ? &j : nullptr, v == 0 ? nullptr : &j, nullptr, nullptr);
     return sign * j;
   }
   if (integer && v < x) {  // the recurrence upward from J0 and J1 is neutral below x
     f64 a, b;
-    BesselJY01(0, x, &a, nullptr);
-    BesselJY01(1, x, &b, nullptr);
+    BesselJY01(x, &a, &b, nullptr, nullptr);
     return sign * static_cast<f64>(BesselRecurUp(a, b, 1, x, static_cast<int64_t>(v) - 1));
   }
   if (integer && !BeyondRange(v, x) && x >= SeriesLimit(v)) return sign * BesselJIntegerDown(static_cast<int64_t>(v), x);
@@ -199,10 +198,9 @@ f64 BesselY(f64 v, f64 x) {
   if (!integer) return Checked(NonIntegerOrder(v, x, true));
   const int64_t m = static_cast<int64_t>(std::fabs(n));
   if (BeyondRange(static_cast<f64>(m), x)) return MathError(kMathOverflow, -sign * kInf);
-  f64 j, a, b;
-  BesselJY01(0, x, &j, &a);
+  f64 a, b;
+  BesselJY01(x, nullptr, nullptr, &a, m == 0 ? nullptr : &b);
   if (m == 0) return a;
-  BesselJY01(1, x, &j, &b);
   const f64 r = static_cast<f64>(BesselRecurUp(a, b, 1, x, m - 1));
   return sign * (std::isfinite(r) ? r : MathError(kMathOverflow, -kInf));
 }

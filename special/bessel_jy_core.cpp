@@ -81,25 +81,37 @@ void HankelPhase(f64 nu, f64 x, f64* cchi, f64* schi) {
 
 }  // namespace
 
-void BesselJY01(int32 n, f64 x, f64* j, f64* y) {
+void BesselJY01(f64 x, f64* j0, f64* j1, f64* y0, f64* y1) {
   if (x <= 8) {
     const f64 t = x * x / 32 - 1;
-    *j = n == 0 ? ChebSeries(t, kJ0Small) : x * ChebSeries(t, kJ1Small);
-    if (!y) return;
+    // Y needs J of its order for the logarithmic part.
+    const f64 a = j0 || y0 ? ChebSeries(t, kJ0Small) : 0;
+    const f64 b = j1 || y1 ? x * ChebSeries(t, kJ1Small) : 0;
+    if (j0) *j0 = a;
+    if (j1) *j1 = b;
+    if (!y0 && !y1) return;
     const f64 l = kTwoOverPi * std::log(x / 2);
-    *y = n == 0 ? ChebSeries(t, kY0Small) + l * *j : (ChebSeries(t, kY1Small) + x * l * *j) / x;
+    if (y0) *y0 = ChebSeries(t, kY0Small) + l * a;
+    if (y1) *y1 = (ChebSeries(t, kY1Small) + x * l * b) / x;
     return;
   }
+  // Hankel's form with the phases chi = x - pi/4 (order 0) and x - 3 pi/4
+  // (order 1), both from one cos x and sin x.
   const f64 t = 128 / (x * x) - 1;
-  const f64 p = n == 0 ? ChebSeries(t, kP0Large) : ChebSeries(t, kP1Large);
-  const f64 q = 8 / x * (n == 0 ? ChebSeries(t, kQ0Large) : ChebSeries(t, kQ1Large));
-  // chi = x - pi/4 or x - 3 pi/4: cos chi and sin chi from cos x and sin x
-  const f64 cx = std::cos(x), sx = std::sin(x);
-  const f64 ca = n == 0 ? kSqrtHalf : -kSqrtHalf;
-  const f64 c = (cx * ca + sx * kSqrtHalf), s = (sx * ca - cx * kSqrtHalf);
   const f64 k = std::sqrt(kTwoOverPi / x);
-  *j = k * (p * c - q * s);
-  if (y) *y = k * (p * s + q * c);
+  const f64 cx = std::cos(x), sx = std::sin(x);
+  const f64 cp = (cx + sx) * kSqrtHalf, cm = (sx - cx) * kSqrtHalf;  // cos, sin of x - pi/4
+  if (j0 || y0) {
+    const f64 p = ChebSeries(t, kP0Large), q = 8 / x * ChebSeries(t, kQ0Large);
+    if (j0) *j0 = k * (p * cp - q * cm);
+    if (y0) *y0 = k * (p * cm + q * cp);
+  }
+  if (j1 || y1) {
+    // x - 3 pi/4 is x - pi/4 turned back by a quarter: cos = sin, sin = -cos
+    const f64 p = ChebSeries(t, kP1Large), q = 8 / x * ChebSeries(t, kQ1Large);
+    if (j1) *j1 = k * (p * cm + q * cp);
+    if (y1) *y1 = k * (-p * cp + q * cm);
+  }
 }
 
 long double SeriesPrefactor(f64 v, f64 x) {
@@ -319,8 +331,7 @@ f64 BesselJIntegerDown(int64_t n, f64 x) {
   const Downward d = RecurDown(static_cast<f64>(n), x, n, sign, f);
   // d.j is J_0 and -d.jp is J_1, unnormalised: scale by the larger one.
   f64 j0, j1;
-  BesselJY01(0, x, &j0, nullptr);
-  BesselJY01(1, x, &j1, nullptr);
+  BesselJY01(x, &j0, &j1, nullptr, nullptr);
   const long double r = std::fabs(j0) >= std::fabs(j1) ? sign * (j0 / d.j) : sign * (j1 / -d.jp);
   return Unscaled(r, d.scale);
 }

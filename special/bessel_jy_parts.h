@@ -9,8 +9,9 @@
 
 namespace tsm {
 
-// Orders 0 and 1 from their Chebyshev sets.
-void BesselJY01(int32 n, f64 x, f64* j, f64* y);
+// J and Y of orders 0 and 1 from their Chebyshev sets, x > 0; only the
+// outputs whose pointers are not null are formed.
+void BesselJY01(f64 x, f64* j0, f64* j1, f64* y0, f64* y1);
 
 // The recurrence C_(m+1) = (2m/x) C_m - C_(m-1) upward, `steps` times from
 // a = C_(m-1), b = C_m, in long double; stops at an infinity.

@@ -52,19 +52,6 @@ constexpr f64 kHankelHump = 16;  // largest term of Hankel's series accepted
 
 }  // namespace
 
-void SinCosPi(f64 r, f64* s, f64* c) {
-  const f64 q = std::nearbyint(2 * r);  // quarter turns
-  const f64 f = r - q / 2;               // exact, |f| <= 1/4
-  const f64 sf = std::sin(kPi * f), cf = std::cos(kPi * f);
-  // fmod keeps the sign of q; & 3 then gives q mod 4 for either sign
-  switch (static_cast<int>(std::fmod(q, 4.0)) & 3) {
-    case 0: *s = sf; *c = cf; break;
-    case 1: *s = cf; *c = -sf; break;
-    case 2: *s = -sf; *c = -cf; break;
-    default: *s = -cf; *c = sf; break;
-  }
-}
-
 namespace {
 
 // cos and sin of chi = x - (nu/2 + 1/4) pi, by the angle difference. The

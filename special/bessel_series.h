@@ -5,9 +5,6 @@
 
 namespace tsm {
 
-// sin(pi r) and cos(pi r), exact at the multiples of 1/2.
-void SinCosPi(f64 r, f64* s, f64* c);
-
 // (x/2)^v / Gamma(v + 1) for any real v that is not a negative integer, x > 0.
 long double SeriesPrefactor(f64 v, f64 x);
 

@@ -25,6 +25,10 @@ enum MathErrorType : int32 { kMathDomain = 0, kMathSingularity = 1, kMathOverflo
 // Called by every domain, singularity and overflow path; does nothing.
 void MathErrorHook(int32 kind, int32 type);
 
+// sin(pi r) and cos(pi r), reduced exactly: exact at the multiples of 1/2
+// and relatively accurate near them.
+void SinCosPi(f64 r, f64* s, f64* c);
+
 namespace detail {
 inline constexpr std::uint64_t kExponentMask = 0x7FF0000000000000ull;
 inline constexpr std::uint64_t kMantissaMask = 0x000FFFFFFFFFFFFFull;

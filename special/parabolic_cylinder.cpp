@@ -57,10 +57,6 @@ constexpr int32 kAsymptoticTerms = 60;
 constexpr f64 kMaxLoss = 8;  // largest term over the sum accepted in the 2F0
 constexpr f64 kMaxStart = 200;  // e^(-x0^2/4) stays within the range of long double
 
-constexpr ld kPi = 3.141592653589793238462643383279503L;
-
-// cos(pi v), reduced exactly to one period first.
-ld CosPi(f64 v) { return std::cos(kPi * static_cast<ld>(std::fmod(v, 2.0))); }
 
 bool Series2F0(f64 a, f64 b, f64 z, f64* s) {
   f64 loss;
@@ -171,9 +167,10 @@ ld GrowingSide(f64 v, f64 x) {
   ld w, dw;
   if (x >= kAsymptoticMinX && Growing(v, x, &w)) return w;
   AtZero(v, &w, &dw);
-  const ld h = kPi / 2 * static_cast<ld>(std::fmod(v, 4.0)), s = std::sin(h), c = std::cos(h);
-  w *= 2 * s * s;
-  dw *= -2 * c * c;
+  f64 s, c;
+  SinCosPi(v / 2, &s, &c);
+  w *= 2 * static_cast<ld>(s) * s;
+  dw *= -2 * static_cast<ld>(c) * c;
   Integrate(v, 0, x, &w, &dw);
   return w;
 }
@@ -193,7 +190,9 @@ f64 ParabolicCylinderD(f64 v, f64 x) {
   const ld d = PositiveSide(v, ax);
   if (IsNaNValue(static_cast<f64>(d))) return MathError(kMathDomain, std::numeric_limits<f64>::quiet_NaN());
   if (x >= 0) return Finish(d);
-  return Finish(CosPi(v) * d + GrowingSide(v, ax));
+  f64 s, c;
+  SinCosPi(v, &s, &c);
+  return Finish(c * d + GrowingSide(v, ax));
 }
 
 }  // namespace tsm
